@@ -1,0 +1,8 @@
+#!/usr/bin/env bash
+# Configures and builds one build tree: scripts/build.sh DIR [cmake options...]
+set -euo pipefail
+root=$(cd "$(dirname "$0")/.." && pwd)
+dir=$1
+shift
+cmake -S "$root" -B "$root/$dir" -G Ninja "$@" >/dev/null
+cmake --build "$root/$dir" -j "$(nproc)"
