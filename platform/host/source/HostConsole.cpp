@@ -6,6 +6,8 @@
 #include <locale.h>
 #include <vector>
 
+#include "tov/host/UnicodeCodec.h"
+
 namespace {
 
 // vswprintf converts `%s` arguments with the thread's LC_CTYPE; a UTF-8 locale
@@ -28,32 +30,6 @@ private:
     locale_t m_Previous = static_cast<locale_t>(0);
 };
 
-// Wide text to UTF-8; code points that cannot be encoded become U+FFFD.
-std::string ToUTF8(const std::wstring& text) {
-    std::string out;
-    out.reserve(text.size());
-    for (wchar_t wc : text) {
-        auto cp = static_cast<uint32_t>(wc);
-        if (cp > 0x10FFFF || (cp >= 0xD800 && cp <= 0xDFFF)) cp = 0xFFFD;
-        if (cp < 0x80) {
-            out += static_cast<char>(cp);
-        } else if (cp < 0x800) {
-            out += static_cast<char>(0xC0 | (cp >> 6));
-            out += static_cast<char>(0x80 | (cp & 0x3F));
-        } else if (cp < 0x10000) {
-            out += static_cast<char>(0xE0 | (cp >> 12));
-            out += static_cast<char>(0x80 | ((cp >> 6) & 0x3F));
-            out += static_cast<char>(0x80 | (cp & 0x3F));
-        } else {
-            out += static_cast<char>(0xF0 | (cp >> 18));
-            out += static_cast<char>(0x80 | ((cp >> 12) & 0x3F));
-            out += static_cast<char>(0x80 | ((cp >> 6) & 0x3F));
-            out += static_cast<char>(0x80 | (cp & 0x3F));
-        }
-    }
-    return out;
-}
-
 }  // namespace
 
 HostConsole::HostConsole()
@@ -61,7 +37,7 @@ HostConsole::HostConsole()
 
 TOVRESULT HostConsole::Write(uint32_t level, const wchar_t* text) {
     if (!text) return TOV_E_INVALIDARG;
-    if (Shows(level)) Emit(level, ToUTF8(text));
+    if (Shows(level)) Emit(level, UnicodeCodec::EncodeUTF8(text));
     return TOV_OK;
 }
 
@@ -91,7 +67,7 @@ TOVRESULT HostConsole::PrintV(uint32_t level, const wchar_t* format, va_list arg
     std::wstring text;
     const TOVRESULT result = FormatWide(format, args, text);
     if (result < 0) return result;
-    Emit(level, ToUTF8(text));
+    Emit(level, UnicodeCodec::EncodeUTF8(text));
     return TOV_OK;
 }
 

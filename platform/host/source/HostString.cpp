@@ -1,0 +1,473 @@
+#include "tov/host/HostString.h"
+
+#include <algorithm>
+#include <cstring>
+#include <locale.h>
+#include <wctype.h>
+
+#include "tov/host/UnicodeCodec.h"
+#include "tov/sdk/TOVComponent.h"
+#include "tov/sdk/TOVPtr.h"
+
+namespace {
+
+[[noreturn]] void Fail(TOVRESULT result) { throw static_cast<int>(result); }
+
+bool Decode(const unsigned char* text, size_t n, std::u32string& out) { return UnicodeCodec::DecodeUTF8(text, n, out); }
+bool Decode(const unsigned short* text, size_t n, std::u32string& out) {
+    return UnicodeCodec::DecodeUTF16(text, n, out);
+}
+bool Decode(const unsigned int* text, size_t n, std::u32string& out) { return UnicodeCodec::DecodeUTF32(text, n, out); }
+bool Decode(const wchar_t* text, size_t n, std::u32string& out) { return UnicodeCodec::DecodeUTF32(text, n, out); }
+
+// Input text: up to `n` units, ending at the first zero.
+template <class Unit>
+std::u32string ReadText(const Unit* text, unsigned int n) {
+    if (!text) {
+        if (n > 1) Fail(TOV_E_INVALIDARG);
+        return {};
+    }
+    size_t length = 0;
+    while (length < n && text[length] != 0) ++length;
+    std::u32string decoded;
+    if (!Decode(text, length, decoded)) Fail(TOV_E_INVALIDARG);
+    return decoded;
+}
+
+// The zero-terminated text at the start of a caller's buffer, which may be unaligned.
+template <class Unit>
+std::u32string ReadBuffer(const unsigned char* buffer, unsigned int size) {
+    std::vector<Unit> units;
+    for (size_t offset = 0; offset + sizeof(Unit) <= size; offset += sizeof(Unit)) {
+        Unit unit;
+        std::memcpy(&unit, buffer + offset, sizeof unit);
+        if (unit == 0) {
+            std::u32string decoded;
+            if (!Decode(units.data(), units.size(), decoded)) Fail(TOV_E_INVALIDARG);
+            return decoded;
+        }
+        units.push_back(unit);
+    }
+    Fail(TOV_E_INVALIDARG);  // no terminator within the buffer
+}
+
+template <class Units>
+std::vector<unsigned char> TerminatedBytes(Units units) {
+    units.push_back(0);
+    const auto* first = reinterpret_cast<const unsigned char*>(units.data());
+    return std::vector<unsigned char>(first, first + units.size() * sizeof units[0]);
+}
+
+// Keeps the address a caller was given while the contents stay the same.
+template <class Buffer>
+void Refresh(Buffer& cache, Buffer fresh) {
+    if (fresh != cache) cache = std::move(fresh);
+}
+
+template <class Units, class Unit>
+TOVRESULT CopyUnits(const Units& units, Unit* out, unsigned int* size) {
+    const auto needed = static_cast<unsigned int>(units.size());
+    if (*size < needed) {
+        *size = needed;
+        return TOV_E_INVALIDARG;
+    }
+    std::copy(units.begin(), units.end(), out);
+    *size = needed;
+    return TOV_OK;
+}
+
+// Created once and kept for the life of the process.
+locale_t CaseLocale() {
+    static const locale_t locale = newlocale(LC_CTYPE_MASK, "C.UTF-8", static_cast<locale_t>(0));
+    if (!locale) Fail(TOV_E_NOTSUPPORTED);
+    return locale;
+}
+
+std::u32string ChangeCase(std::u32string text, bool upper) {
+    const locale_t locale = CaseLocale();
+    for (char32_t& cp : text) cp = upper ? towupper_l(cp, locale) : towlower_l(cp, locale);
+    return text;
+}
+
+// Upper then lower also joins letters with several lower forms (final sigma, long s).
+std::u32string Folded(std::u32string text) { return ChangeCase(ChangeCase(std::move(text), true), false); }
+
+}  // namespace
+
+TOVRESULT HostString::TOVCreate(ITOVUnknown* host, ITOVUnknown* outer, const _tovUID& iid, void** out) {
+    return TOVCreateComponent<HostString>(host, outer, iid, out);
+}
+
+TOVRESULT HostString::InternalQueryInterface(const _tovUID& iid, void** out) {
+    return TOVGuarded([&] {
+        if (!out) return TOV_E_INVALIDARG;
+        if (iid == IID_ITOVString) return TOVExpose<ITOVString>(this, out);
+        return CTOVUnknown::InternalQueryInterface(iid, out);
+    });
+}
+
+// ---- Changing the text
+
+TOVRESULT HostString::Assign(_tovUnicodeType type, ITOVString* source) {
+    return TOVGuarded([&] { return AssignText(type, TextOf(source)); });
+}
+
+TOVRESULT HostString::Assign(_tovUnicodeType type, const unsigned char* text, unsigned int n) {
+    return TOVGuarded([&] { return AssignText(type, ReadText(text, n)); });
+}
+
+TOVRESULT HostString::Assign(_tovUnicodeType type, const unsigned short* text, unsigned int n) {
+    return TOVGuarded([&] { return AssignText(type, ReadText(text, n)); });
+}
+
+TOVRESULT HostString::Assign(_tovUnicodeType type, const unsigned int* text, unsigned int n) {
+    return TOVGuarded([&] { return AssignText(type, ReadText(text, n)); });
+}
+
+TOVRESULT HostString::Assign(_tovUnicodeType type, const wchar_t* text, unsigned int n) {
+    return TOVGuarded([&] { return AssignText(type, ReadText(text, n)); });
+}
+
+TOVRESULT HostString::AssignText(_tovUnicodeType type, const std::u32string& text) {
+    if (!IsKnownType(type)) return TOV_E_INVALIDARG;
+    Commit(text, type);
+    return TOV_OK;
+}
+
+TOVRESULT HostString::ConvertTo(_tovUnicodeType type) {
+    return TOVGuarded([&] { return AssignText(type, CodePoints()); });
+}
+
+TOVRESULT HostString::ToLower() {
+    return TOVGuarded([&] {
+        Commit(ChangeCase(CodePoints(), false), m_Type);
+        return TOV_OK;
+    });
+}
+
+TOVRESULT HostString::ToUpper() {
+    return TOVGuarded([&] {
+        Commit(ChangeCase(CodePoints(), true), m_Type);
+        return TOV_OK;
+    });
+}
+
+TOVRESULT HostString::ConvertedCopy(_tovUnicodeType type, ITOVString** out) {
+    return TOVGuarded([&] {
+        if (!out) return TOV_E_INVALIDARG;
+        *out = nullptr;
+        if (!IsKnownType(type)) return TOV_E_INVALIDARG;
+        TOVPtr<ITOVString> copy;
+        TOVCheck(TOVCreate(nullptr, nullptr, IID_ITOVString, copy.Out()));
+        TOVCheck(copy->Assign(type, this));
+        *out = copy.Detach();
+        return TOV_OK;
+    });
+}
+
+TOVRESULT HostString::Append(ITOVString* text) {
+    return TOVGuarded([&] { return AppendText(TextOf(text)); });
+}
+
+TOVRESULT HostString::Append(const unsigned char* text, unsigned int n) {
+    return TOVGuarded([&] { return AppendText(ReadText(text, n)); });
+}
+
+TOVRESULT HostString::Append(const unsigned short* text, unsigned int n) {
+    return TOVGuarded([&] { return AppendText(ReadText(text, n)); });
+}
+
+TOVRESULT HostString::Append(const unsigned int* text, unsigned int n) {
+    return TOVGuarded([&] { return AppendText(ReadText(text, n)); });
+}
+
+TOVRESULT HostString::Append(const wchar_t* text, unsigned int n) {
+    return TOVGuarded([&] { return AppendText(ReadText(text, n)); });
+}
+
+TOVRESULT HostString::AppendText(const std::u32string& text) {
+    Commit(CodePoints() + text, m_Type);
+    return TOV_OK;
+}
+
+TOVRESULT HostString::Clear() {
+    return TOVGuarded([&] {
+        Commit(std::u32string(), m_Type);
+        return TOV_OK;
+    });
+}
+
+TOVRESULT HostString::Truncate(unsigned int count) {
+    return TOVGuarded([&] {
+        if (count < m_Text.size()) Commit(CodePoints().substr(0, count), m_Type);
+        return TOV_OK;
+    });
+}
+
+void HostString::Commit(const std::u32string& text, _tovUnicodeType type) {
+    // Everything that can fail happens before the first change.
+    std::wstring stored(text.begin(), text.end());
+    if (m_External) {
+        const std::vector<unsigned char> bytes = EncodeBytes(text, type);
+        if (bytes.size() > m_ExternalSize) Fail(TOV_E_OUTOFRANGE);
+        std::memcpy(m_External, bytes.data(), bytes.size());
+    }
+    m_Text.swap(stored);
+    m_Type = type;
+}
+
+// ---- Views and counts
+
+TOVRESULT HostString::GetUTF8String(const unsigned char** out) {
+    return TOVGuarded([&] {
+        if (!out) return TOV_E_INVALIDARG;
+        Refresh(m_UTF8, UnicodeCodec::EncodeUTF8(std::wstring_view(m_Text)));
+        *out = reinterpret_cast<const unsigned char*>(m_UTF8.c_str());
+        return TOV_OK;
+    });
+}
+
+TOVRESULT HostString::GetUTF16String(const unsigned short** out) {
+    return TOVGuarded([&] {
+        if (!out) return TOV_E_INVALIDARG;
+        std::vector<unsigned short> units = UnicodeCodec::EncodeUTF16(CodePoints());
+        units.push_back(0);
+        Refresh(m_UTF16, std::move(units));
+        *out = m_UTF16.data();
+        return TOV_OK;
+    });
+}
+
+TOVRESULT HostString::GetUTF32String(const unsigned int** out) {
+    return TOVGuarded([&] {
+        if (!out) return TOV_E_INVALIDARG;
+        std::vector<unsigned int> units = UnicodeCodec::EncodeUTF32(CodePoints());
+        units.push_back(0);
+        Refresh(m_UTF32, std::move(units));
+        *out = m_UTF32.data();
+        return TOV_OK;
+    });
+}
+
+TOVRESULT HostString::GetWCHARString(wchar_t** out) {
+    if (!out) return TOV_E_INVALIDARG;
+    *out = m_Text.data();
+    return TOV_OK;
+}
+
+uint32_t HostString::GetCodePointCount() {
+    if (m_Type != kTOVUnicodeUTF8 && m_Type != kTOVUnicodeUTF16) return static_cast<uint32_t>(m_Text.size());
+    size_t units = 0;
+    for (wchar_t wc : m_Text) {
+        const auto cp = static_cast<char32_t>(wc);
+        units += m_Type == kTOVUnicodeUTF8 ? UnicodeCodec::UTF8Length(cp) : UnicodeCodec::UTF16Length(cp);
+    }
+    return static_cast<uint32_t>(units);
+}
+
+uint32_t HostString::GetByteCount() {
+    const uint32_t unitSize = m_Type == kTOVUnicodeUTF8 ? 1 : m_Type == kTOVUnicodeUTF16 ? 2 : 4;
+    return GetCodePointCount() * unitSize;
+}
+
+uint32_t HostString::GetNumCharacters() { return static_cast<uint32_t>(m_Text.size()); }
+
+std::u32string HostString::CodePoints() const {
+    std::u32string text;
+    text.reserve(m_Text.size());
+    for (wchar_t wc : m_Text) {
+        const auto value = static_cast<uint32_t>(wc);
+        text += UnicodeCodec::IsScalarValue(value) ? static_cast<char32_t>(value) : UnicodeCodec::kReplacement;
+    }
+    return text;
+}
+
+std::u32string HostString::TextOf(ITOVString* source) {
+    if (!source) Fail(TOV_E_INVALIDARG);
+    const unsigned int* units = nullptr;
+    TOVCheck(source->GetUTF32String(&units));
+    if (!units) Fail(TOV_E_POINTER);
+    std::u32string text;
+    if (!UnicodeCodec::DecodeUTF32(units, source->GetNumCharacters(), text)) Fail(TOV_E_INVALIDARG);
+    return text;
+}
+
+// ---- Comparing and searching
+
+TOVRESULT HostString::Compare(ITOVString* other, int* result, int caseSensitive) {
+    return TOVGuarded([&] { return CompareText(TextOf(other), result, caseSensitive); });
+}
+
+TOVRESULT HostString::Compare(const unsigned char* text, unsigned int n, int* result, int caseSensitive) {
+    return TOVGuarded([&] { return CompareText(ReadText(text, n), result, caseSensitive); });
+}
+
+TOVRESULT HostString::Compare(const unsigned short* text, unsigned int n, int* result, int caseSensitive) {
+    return TOVGuarded([&] { return CompareText(ReadText(text, n), result, caseSensitive); });
+}
+
+TOVRESULT HostString::Compare(const unsigned int* text, unsigned int n, int* result, int caseSensitive) {
+    return TOVGuarded([&] { return CompareText(ReadText(text, n), result, caseSensitive); });
+}
+
+TOVRESULT HostString::Compare(const wchar_t* text, unsigned int n, int* result, int caseSensitive) {
+    return TOVGuarded([&] { return CompareText(ReadText(text, n), result, caseSensitive); });
+}
+
+TOVRESULT HostString::CompareText(const std::u32string& other, int* result, int caseSensitive) const {
+    if (!result) return TOV_E_INVALIDARG;
+    const int order = caseSensitive ? CodePoints().compare(other) : Folded(CodePoints()).compare(Folded(other));
+    *result = order < 0 ? -1 : order > 0 ? 1 : 0;
+    return TOV_OK;
+}
+
+TOVRESULT HostString::FindString(ITOVString* text, int start, int* position) {
+    return TOVGuarded([&] { return FindText(TextOf(text), start, position); });
+}
+
+TOVRESULT HostString::FindString(const unsigned char* text, unsigned int n, int start, int* position) {
+    return TOVGuarded([&] { return FindText(ReadText(text, n), start, position); });
+}
+
+TOVRESULT HostString::FindString(const unsigned short* text, unsigned int n, int start, int* position) {
+    return TOVGuarded([&] { return FindText(ReadText(text, n), start, position); });
+}
+
+TOVRESULT HostString::FindString(const unsigned int* text, unsigned int n, int start, int* position) {
+    return TOVGuarded([&] { return FindText(ReadText(text, n), start, position); });
+}
+
+TOVRESULT HostString::FindString(const wchar_t* text, unsigned int n, int start, int* position) {
+    return TOVGuarded([&] { return FindText(ReadText(text, n), start, position); });
+}
+
+TOVRESULT HostString::FindStringReverse(ITOVString* text, int start, int* position) {
+    return TOVGuarded([&] { return FindTextReverse(TextOf(text), start, position); });
+}
+
+TOVRESULT HostString::FindStringReverse(const unsigned char* text, unsigned int n, int start, int* position) {
+    return TOVGuarded([&] { return FindTextReverse(ReadText(text, n), start, position); });
+}
+
+TOVRESULT HostString::FindStringReverse(const unsigned short* text, unsigned int n, int start, int* position) {
+    return TOVGuarded([&] { return FindTextReverse(ReadText(text, n), start, position); });
+}
+
+TOVRESULT HostString::FindStringReverse(const unsigned int* text, unsigned int n, int start, int* position) {
+    return TOVGuarded([&] { return FindTextReverse(ReadText(text, n), start, position); });
+}
+
+TOVRESULT HostString::FindStringReverse(const wchar_t* text, unsigned int n, int start, int* position) {
+    return TOVGuarded([&] { return FindTextReverse(ReadText(text, n), start, position); });
+}
+
+TOVRESULT HostString::FindText(const std::u32string& needle, int start, int* position) const {
+    if (!position) return TOV_E_INVALIDARG;
+    const size_t found = CodePoints().find(needle, start < 0 ? 0 : static_cast<size_t>(start));
+    *position = found == std::u32string::npos ? -1 : static_cast<int>(found);
+    return TOV_OK;
+}
+
+TOVRESULT HostString::FindTextReverse(const std::u32string& needle, int start, int* position) const {
+    if (!position) return TOV_E_INVALIDARG;
+    const bool fromEnd = start < 0 || static_cast<size_t>(start) >= m_Text.size();
+    const size_t found = CodePoints().rfind(needle, fromEnd ? std::u32string::npos : static_cast<size_t>(start));
+    *position = found == std::u32string::npos ? -1 : static_cast<int>(found);
+    return TOV_OK;
+}
+
+// ---- Single characters
+
+TOVRESULT HostString::GetCharacter(unsigned int index, unsigned char* out, unsigned int* size) {
+    return TOVGuarded([&] {
+        if (!out || !size) return TOV_E_INVALIDARG;
+        return CopyUnits(UnicodeCodec::EncodeUTF8(std::u32string(1, CharacterAt(index))), out, size);
+    });
+}
+
+TOVRESULT HostString::GetCharacter(unsigned int index, unsigned short* out, unsigned int* size) {
+    return TOVGuarded([&] {
+        if (!out || !size) return TOV_E_INVALIDARG;
+        return CopyUnits(UnicodeCodec::EncodeUTF16(std::u32string(1, CharacterAt(index))), out, size);
+    });
+}
+
+TOVRESULT HostString::GetCharacter(unsigned int index, unsigned int* codePoint) {
+    return TOVGuarded([&] {
+        if (!codePoint) return TOV_E_INVALIDARG;
+        *codePoint = CharacterAt(index);
+        return TOV_OK;
+    });
+}
+
+TOVRESULT HostString::SetCharacter(unsigned int index, const unsigned char* text, unsigned int size) {
+    return TOVGuarded([&] { return SetCharacterText(index, ReadText(text, size)); });
+}
+
+TOVRESULT HostString::SetCharacter(unsigned int index, const unsigned short* text, unsigned int size) {
+    return TOVGuarded([&] { return SetCharacterText(index, ReadText(text, size)); });
+}
+
+TOVRESULT HostString::SetCharacter(unsigned int index, unsigned int codePoint) {
+    return TOVGuarded([&] { return SetCharacterText(index, ReadText(&codePoint, 1)); });
+}
+
+TOVRESULT HostString::SetCharacterText(unsigned int index, const std::u32string& character) {
+    if (index >= m_Text.size()) return TOV_E_OUTOFRANGE;
+    if (character.size() != 1) return TOV_E_INVALIDARG;
+    std::u32string text = CodePoints();
+    text[index] = character[0];
+    Commit(text, m_Type);
+    return TOV_OK;
+}
+
+char32_t HostString::CharacterAt(unsigned int index) const {
+    if (index >= m_Text.size()) Fail(TOV_E_OUTOFRANGE);
+    const auto value = static_cast<uint32_t>(m_Text[index]);
+    return UnicodeCodec::IsScalarValue(value) ? static_cast<char32_t>(value) : UnicodeCodec::kReplacement;
+}
+
+// ---- External storage
+
+TOVRESULT HostString::SetExternalBuffer(_tovUnicodeType type, unsigned char* buffer, unsigned int size) {
+    return TOVGuarded([&] {
+        if (!buffer || !IsKnownType(type)) return TOV_E_INVALIDARG;
+        if (m_External) return ZEB_E_ALREADYSET;
+        std::u32string text;
+        if (type == kTOVUnicodeUTF8) {
+            text = ReadBuffer<unsigned char>(buffer, size);
+        } else if (type == kTOVUnicodeUTF16) {
+            text = ReadBuffer<unsigned short>(buffer, size);
+        } else {
+            text = ReadBuffer<unsigned int>(buffer, size);
+        }
+        // The buffer already holds this text, so it is only adopted afterwards.
+        Commit(text, type);
+        m_External = buffer;
+        m_ExternalSize = size;
+        return TOV_OK;
+    });
+}
+
+TOVRESULT HostString::RemoveExternalBuffer(unsigned char** buffer) {
+    if (!buffer) return TOV_E_INVALIDARG;
+    *buffer = m_External;
+    if (!m_External) return ZEB_E_NOTREADY;
+    m_External = nullptr;
+    m_ExternalSize = 0;
+    return TOV_OK;
+}
+
+std::vector<unsigned char> HostString::EncodeBytes(const std::u32string& text, _tovUnicodeType type) {
+    if (type == kTOVUnicodeUTF8) {
+        const std::string units = UnicodeCodec::EncodeUTF8(text);
+        return TerminatedBytes(std::vector<unsigned char>(units.begin(), units.end()));
+    }
+    if (type == kTOVUnicodeUTF16) return TerminatedBytes(UnicodeCodec::EncodeUTF16(text));
+    return TerminatedBytes(UnicodeCodec::EncodeUTF32(text));
+}
+
+bool HostString::IsKnownType(_tovUnicodeType type) {
+    return type == kTOVUnicodeUTF8 || type == kTOVUnicodeUTF16 || type == kTOVUnicodeUTF32 ||
+           type == kTOVUnicodeWCHAR;
+}

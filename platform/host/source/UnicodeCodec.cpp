@@ -1,0 +1,150 @@
+#include "tov/host/UnicodeCodec.h"
+
+static_assert(sizeof(wchar_t) == 4, "wide text is handled as UTF-32");
+
+namespace {
+
+bool IsContinuation(unsigned char byte) { return (byte & 0xC0) == 0x80; }
+
+char32_t Scalar(uint32_t value) {
+    return UnicodeCodec::IsScalarValue(value) ? static_cast<char32_t>(value) : UnicodeCodec::kReplacement;
+}
+
+template <class CodePoint>
+std::string EncodeUTF8Of(const CodePoint* text, size_t n) {
+    std::string out;
+    out.reserve(n);
+    for (size_t i = 0; i < n; ++i) {
+        const char32_t cp = Scalar(static_cast<uint32_t>(text[i]));
+        if (cp < 0x80) {
+            out += static_cast<char>(cp);
+        } else if (cp < 0x800) {
+            out += static_cast<char>(0xC0 | (cp >> 6));
+            out += static_cast<char>(0x80 | (cp & 0x3F));
+        } else if (cp < 0x10000) {
+            out += static_cast<char>(0xE0 | (cp >> 12));
+            out += static_cast<char>(0x80 | ((cp >> 6) & 0x3F));
+            out += static_cast<char>(0x80 | (cp & 0x3F));
+        } else {
+            out += static_cast<char>(0xF0 | (cp >> 18));
+            out += static_cast<char>(0x80 | ((cp >> 12) & 0x3F));
+            out += static_cast<char>(0x80 | ((cp >> 6) & 0x3F));
+            out += static_cast<char>(0x80 | (cp & 0x3F));
+        }
+    }
+    return out;
+}
+
+template <class Unit>
+bool DecodeUTF32Of(const Unit* text, size_t n, std::u32string& out) {
+    std::u32string decoded;
+    decoded.reserve(n);
+    for (size_t i = 0; i < n; ++i) {
+        const auto value = static_cast<uint32_t>(text[i]);
+        if (!UnicodeCodec::IsScalarValue(value)) return false;
+        decoded += static_cast<char32_t>(value);
+    }
+    out = std::move(decoded);
+    return true;
+}
+
+}  // namespace
+
+bool UnicodeCodec::IsScalarValue(uint32_t value) { return value <= 0x10FFFF && (value < 0xD800 || value > 0xDFFF); }
+
+bool UnicodeCodec::DecodeUTF8(const unsigned char* text, size_t n, std::u32string& out) {
+    std::u32string decoded;
+    decoded.reserve(n);
+    size_t i = 0;
+    while (i < n) {
+        const unsigned char lead = text[i];
+        size_t length;
+        uint32_t cp;
+        uint32_t minimum;
+        if (lead < 0x80) {
+            decoded += static_cast<char32_t>(lead);
+            ++i;
+            continue;
+        }
+        if (lead >= 0xC2 && lead <= 0xDF) {
+            length = 2, cp = lead & 0x1F, minimum = 0x80;
+        } else if (lead >= 0xE0 && lead <= 0xEF) {
+            length = 3, cp = lead & 0x0F, minimum = 0x800;
+        } else if (lead >= 0xF0 && lead <= 0xF4) {
+            length = 4, cp = lead & 0x07, minimum = 0x10000;
+        } else {
+            return false;  // a stray continuation byte, 0xC0, 0xC1 or 0xF5 and above
+        }
+        if (n - i < length) return false;
+        for (size_t k = 1; k < length; ++k) {
+            if (!IsContinuation(text[i + k])) return false;
+            cp = (cp << 6) | (text[i + k] & 0x3F);
+        }
+        // Overlong forms, encoded surrogates and values past 0x10FFFF.
+        if (cp < minimum || !IsScalarValue(cp)) return false;
+        decoded += static_cast<char32_t>(cp);
+        i += length;
+    }
+    out = std::move(decoded);
+    return true;
+}
+
+bool UnicodeCodec::DecodeUTF16(const unsigned short* text, size_t n, std::u32string& out) {
+    std::u32string decoded;
+    decoded.reserve(n);
+    for (size_t i = 0; i < n; ++i) {
+        const uint32_t unit = text[i];
+        if (unit < 0xD800 || unit > 0xDFFF) {
+            decoded += static_cast<char32_t>(unit);
+            continue;
+        }
+        if (unit > 0xDBFF || i + 1 == n) return false;  // a lone low half, or a high half at the end
+        const uint32_t low = text[i + 1];
+        if (low < 0xDC00 || low > 0xDFFF) return false;
+        decoded += static_cast<char32_t>(0x10000 + ((unit - 0xD800) << 10) + (low - 0xDC00));
+        ++i;
+    }
+    out = std::move(decoded);
+    return true;
+}
+
+bool UnicodeCodec::DecodeUTF32(const unsigned int* text, size_t n, std::u32string& out) {
+    return DecodeUTF32Of(text, n, out);
+}
+
+bool UnicodeCodec::DecodeUTF32(const wchar_t* text, size_t n, std::u32string& out) {
+    return DecodeUTF32Of(text, n, out);
+}
+
+std::string UnicodeCodec::EncodeUTF8(std::u32string_view text) { return EncodeUTF8Of(text.data(), text.size()); }
+
+std::string UnicodeCodec::EncodeUTF8(std::wstring_view text) { return EncodeUTF8Of(text.data(), text.size()); }
+
+std::vector<unsigned short> UnicodeCodec::EncodeUTF16(std::u32string_view text) {
+    std::vector<unsigned short> out;
+    out.reserve(text.size());
+    for (char32_t value : text) {
+        const char32_t cp = Scalar(value);
+        if (cp < 0x10000) {
+            out.push_back(static_cast<unsigned short>(cp));
+        } else {
+            out.push_back(static_cast<unsigned short>(0xD800 + ((cp - 0x10000) >> 10)));
+            out.push_back(static_cast<unsigned short>(0xDC00 + ((cp - 0x10000) & 0x3FF)));
+        }
+    }
+    return out;
+}
+
+std::vector<unsigned int> UnicodeCodec::EncodeUTF32(std::u32string_view text) {
+    std::vector<unsigned int> out;
+    out.reserve(text.size());
+    for (char32_t value : text) out.push_back(Scalar(value));
+    return out;
+}
+
+size_t UnicodeCodec::UTF8Length(char32_t codePoint) {
+    const char32_t cp = Scalar(codePoint);
+    return cp < 0x80 ? 1 : cp < 0x800 ? 2 : cp < 0x10000 ? 3 : 4;
+}
+
+size_t UnicodeCodec::UTF16Length(char32_t codePoint) { return Scalar(codePoint) < 0x10000 ? 1 : 2; }
