@@ -74,6 +74,7 @@ TOVRESULT HostConsole::PrintV(uint32_t level, const wchar_t* format, va_list arg
 TOVRESULT HostConsole::PrintNarrowV(uint32_t level, const char* format, va_list args) {
     if (!format) return TOV_E_INVALIDARG;
     if (!Shows(level)) return TOV_OK;
+    ScopedUTF8Locale utf8;  // `%ls` arguments are converted to UTF-8
     va_list copy;
     va_copy(copy, args);
     const int length = std::vsnprintf(nullptr, 0, format, copy);

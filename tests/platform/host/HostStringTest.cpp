@@ -1,0 +1,453 @@
+// The host's string component, driven through its interface only.
+#include <gtest/gtest.h>
+
+#include <cstring>
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "tov/host/HostString.h"
+#include "tov/host/TOVHost.h"
+#include "tov/host/UnicodeCodec.h"
+#include "tov/sdk/TOVPtr.h"
+
+namespace {
+
+constexpr _tovUnicodeType kTypes[] = {kTOVUnicodeUTF8, kTOVUnicodeUTF16, kTOVUnicodeUTF32, kTOVUnicodeWCHAR};
+constexpr int kForms = 4;  // the pointer forms: UTF-8, UTF-16, UTF-32, wchar_t
+
+// A-acute-euro-grinning face: one, two, three and four UTF-8 bytes, the last a surrogate pair in UTF-16.
+const char kMixedUTF8[] = u8"Aé€😀";
+const std::u32string kMixed = U"Aé€😀";
+
+const unsigned char* Bytes(const char* text) { return reinterpret_cast<const unsigned char*>(text); }
+
+// Calls `op(pointer, n)` with `text` in pointer form `form`, so one case covers every overload.
+template <class Op>
+TOVRESULT InForm(int form, std::u32string_view text, Op op) {
+    const std::string utf8 = UnicodeCodec::EncodeUTF8(text);
+    const std::vector<unsigned short> utf16 = UnicodeCodec::EncodeUTF16(text);
+    const std::vector<unsigned int> utf32 = UnicodeCodec::EncodeUTF32(text);
+    const std::wstring wide(text.begin(), text.end());
+    switch (form) {
+        case 0: return op(Bytes(utf8.c_str()), static_cast<unsigned int>(utf8.size()));
+        case 1: return op(utf16.data(), static_cast<unsigned int>(utf16.size()));
+        case 2: return op(utf32.data(), static_cast<unsigned int>(utf32.size()));
+        default: return op(wide.c_str(), static_cast<unsigned int>(wide.size()));
+    }
+}
+
+TOVPtr<ITOVString> NewString(_tovUnicodeType type, std::u32string_view text) {
+    TOVPtr<ITOVString> s;
+    EXPECT_EQ(HostString::TOVCreate(nullptr, nullptr, IID_ITOVString, s.Out()), TOV_OK);
+    EXPECT_EQ(InForm(3, text, [&](auto p, unsigned int n) { return s->Assign(type, p, n); }), TOV_OK);
+    return s;
+}
+
+std::string UTF8Of(ITOVString* s) {
+    const unsigned char* p = nullptr;
+    EXPECT_EQ(s->GetUTF8String(&p), TOV_OK);
+    return reinterpret_cast<const char*>(p);
+}
+
+std::u16string UTF16Of(ITOVString* s) {
+    const unsigned short* p = nullptr;
+    EXPECT_EQ(s->GetUTF16String(&p), TOV_OK);
+    std::u16string text;
+    while (*p) text += static_cast<char16_t>(*p++);
+    return text;
+}
+
+std::u32string UTF32Of(ITOVString* s) {
+    const unsigned int* p = nullptr;
+    EXPECT_EQ(s->GetUTF32String(&p), TOV_OK);
+    std::u32string text;
+    while (*p) text += static_cast<char32_t>(*p++);
+    return text;
+}
+
+std::u32string WideOf(ITOVString* s) {
+    wchar_t* p = nullptr;
+    EXPECT_EQ(s->GetWCHARString(&p), TOV_OK);
+    return std::u32string(p, p + std::wcslen(p));
+}
+
+// Every test must leave no string alive.
+class HostStringTest : public testing::Test {
+protected:
+    void SetUp() override { m_Active = CTOVUnknown::GetActiveObjectCount(); }
+    void TearDown() override { EXPECT_EQ(CTOVUnknown::GetActiveObjectCount(), m_Active); }
+
+private:
+    int32_t m_Active = 0;
+};
+
+TEST_F(HostStringTest, AnswersItsInterfacesAndDiesWithItsLastReference) {
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, U"x");
+    TOVPtr<ITOVUnknown> unknown;
+    EXPECT_EQ(s->QueryInterface(IID_ITOVUnknown, unknown.Out()), TOV_OK);
+    TOVPtr<ITOVString> again;
+    EXPECT_EQ(unknown->QueryInterface(IID_ITOVString, again.Out()), TOV_OK);
+    EXPECT_EQ(again.Get(), s.Get());
+    void* none = &none;
+    EXPECT_EQ(s->QueryInterface(IID_ITOVConsole, &none), TOV_E_NOINTERFACE);
+    EXPECT_EQ(none, nullptr);
+    EXPECT_EQ(s->QueryInterface(IID_ITOVString, nullptr), TOV_E_INVALIDARG);
+    again.Reset();
+    unknown.Reset();
+    EXPECT_EQ(s.Detach()->Release(), 0u);
+}
+
+TEST_F(HostStringTest, IsCreatedByTheHostsFactory) {
+    TOVPtr<TOVHost> host = TOVHost::Create();
+    TOVPtr<ITOVString> s;
+    ASSERT_EQ(host->CreateComponent(TOVCompID_TOVString, nullptr, IID_ITOVString, s.Out()), TOV_OK);
+    EXPECT_EQ(s->IsEmpty(), 1);
+    EXPECT_EQ(s->Assign(kTOVUnicodeUTF8, Bytes(kMixedUTF8), sizeof kMixedUTF8), TOV_OK);
+    EXPECT_EQ(WideOf(s.Get()), kMixed);
+}
+
+TEST_F(HostStringTest, ConvertsBetweenEveryEncodingAndForm) {
+    struct Counts {
+        uint32_t units, bytes;
+    };
+    const Counts counts[] = {{10, 10}, {5, 10}, {4, 16}, {4, 16}};  // in the order of kTypes
+    for (int form = 0; form < kForms; ++form) {
+        for (_tovUnicodeType stored : kTypes) {
+            SCOPED_TRACE(testing::Message() << "form " << form << ", stored " << stored);
+            TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, U"old");
+            ASSERT_EQ(InForm(form, kMixed, [&](auto p, unsigned int n) { return s->Assign(stored, p, n); }),
+                      TOV_OK);
+            for (_tovUnicodeType target : kTypes) {
+                ASSERT_EQ(s->ConvertTo(target), TOV_OK);
+                EXPECT_EQ(s->GetUnicodeType(), target);
+                EXPECT_EQ(UTF8Of(s.Get()), kMixedUTF8);
+                EXPECT_EQ(UTF16Of(s.Get()), u"Aé€😀");
+                EXPECT_EQ(UTF32Of(s.Get()), kMixed);
+                EXPECT_EQ(WideOf(s.Get()), kMixed);
+                EXPECT_EQ(s->GetCodePointCount(), counts[target - 1].units);
+                EXPECT_EQ(s->GetByteCount(), counts[target - 1].bytes);
+                EXPECT_EQ(s->GetNumCharacters(), 4u);
+                EXPECT_EQ(s->GetUnicodeType(), target);  // the views did not convert the string
+            }
+        }
+    }
+}
+
+TEST_F(HostStringTest, InputEndsAtTheFirstZeroWithinN) {
+    struct Case {
+        const char* text;
+        unsigned int n;
+        const char* expected;
+    };
+    const Case cases[] = {
+        {"abc", 3, "abc"}, {"abc", 4, "abc"}, {"abc", 2, "ab"}, {"ab\0cd", 5, "ab"},
+        {"abc", 0, ""},    {nullptr, 0, ""},  {nullptr, 1, ""},
+    };
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, U"old");
+    for (const Case& c : cases) {
+        SCOPED_TRACE(c.expected);
+        ASSERT_EQ(s->Assign(kTOVUnicodeUTF16, Bytes(c.text), c.n), TOV_OK);
+        EXPECT_EQ(UTF8Of(s.Get()), c.expected);
+        EXPECT_EQ(s->GetCodePointCount(), std::strlen(c.expected));
+    }
+    const unsigned short wideZeros[] = {0x41, 0, 0};
+    ASSERT_EQ(s->Assign(kTOVUnicodeUTF16, wideZeros, 3), TOV_OK);
+    EXPECT_EQ(UTF8Of(s.Get()), "A");
+}
+
+TEST_F(HostStringTest, RefusesMalformedInputAndKeepsTheText) {
+    const unsigned short loneHigh[] = {0x41, 0xD83D};
+    const unsigned short loneLow[] = {0xDE00, 0x41};
+    const unsigned int tooLarge[] = {0x110000};
+    const unsigned int surrogate[] = {0xDC00};
+    const wchar_t wideSurrogate[] = {L'a', static_cast<wchar_t>(0xD800)};
+    struct Case {
+        const char* name;
+        std::function<TOVRESULT(ITOVString*)> op;
+        TOVRESULT expected;
+    };
+    const Case cases[] = {
+        {"overlong UTF-8", [](ITOVString* s) { return s->Assign(kTOVUnicodeUTF8, Bytes("\xC0\x80"), 2); }},
+        {"truncated UTF-8", [](ITOVString* s) { return s->Assign(kTOVUnicodeUTF8, Bytes("ab\xE2\x82"), 4); }},
+        {"0xF5 in UTF-8", [](ITOVString* s) { return s->Append(Bytes("\xF5\x80\x80\x80"), 4); }},
+        {"encoded surrogate", [](ITOVString* s) { return s->Append(Bytes("\xED\xA0\x80"), 3); }},
+        {"lone high surrogate", [&](ITOVString* s) { return s->Assign(kTOVUnicodeUTF8, loneHigh, 2); }},
+        {"lone low surrogate", [&](ITOVString* s) { return s->Append(loneLow, 2); }},
+        {"above 0x10FFFF", [&](ITOVString* s) { return s->Assign(kTOVUnicodeUTF32, tooLarge, 1); }},
+        {"UTF-32 surrogate", [&](ITOVString* s) { return s->Append(surrogate, 1); }},
+        {"wide surrogate", [&](ITOVString* s) { return s->Assign(kTOVUnicodeWCHAR, wideSurrogate, 2); }},
+        {"null text with n 2", [](ITOVString* s) { return s->Assign(kTOVUnicodeUTF8, (const wchar_t*)nullptr, 2); }},
+        {"unknown type 0", [](ITOVString* s) { return s->Assign(static_cast<_tovUnicodeType>(0), L"x", 1); }},
+        {"unknown type 5", [](ITOVString* s) { return s->ConvertTo(static_cast<_tovUnicodeType>(5)); }},
+        {"null source", [](ITOVString* s) { return s->Assign(kTOVUnicodeUTF8, (ITOVString*)nullptr); }},
+        {"set a partial character", [](ITOVString* s) { return s->SetCharacter(1, Bytes("\xC3"), 1); }},
+        {"set two characters", [](ITOVString* s) { return s->SetCharacter(1, Bytes("ab"), 2); }},
+        {"set a lone surrogate", [&](ITOVString* s) { return s->SetCharacter(1, loneLow, 1); }},
+        {"set a surrogate value", [](ITOVString* s) { return s->SetCharacter(1, 0xD800u); }},
+        {"set above 0x10FFFF", [](ITOVString* s) { return s->SetCharacter(1, 0x110000u); }},
+        {"set U+0000", [](ITOVString* s) { return s->SetCharacter(1, 0u); }},
+    };
+    for (const Case& c : cases) {
+        SCOPED_TRACE(c.name);
+        TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF16, kMixed);
+        EXPECT_EQ(c.op(s.Get()), TOV_E_INVALIDARG);
+        EXPECT_EQ(WideOf(s.Get()), kMixed);
+        EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF16);
+    }
+}
+
+TEST_F(HostStringTest, ViewsStayPutUntilTheTextChanges) {
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF16, kMixed);
+    const unsigned char* utf8 = nullptr;
+    const unsigned int* utf32 = nullptr;
+    ASSERT_EQ(s->GetUTF8String(&utf8), TOV_OK);
+    ASSERT_EQ(s->GetUTF32String(&utf32), TOV_OK);
+    const unsigned char* utf8Again = nullptr;
+    ASSERT_EQ(s->GetUTF8String(&utf8Again), TOV_OK);
+    EXPECT_EQ(utf8Again, utf8);
+    EXPECT_STREQ(reinterpret_cast<const char*>(utf8), kMixedUTF8);  // both views readable at once
+    EXPECT_EQ(utf32[3], 0x1F600u);
+    EXPECT_EQ(s->Append(L"!", 1), TOV_OK);
+    EXPECT_EQ(UTF8Of(s.Get()), std::string(kMixedUTF8) + "!");
+}
+
+TEST_F(HostStringTest, WideStorageCanBeRewrittenInPlace) {
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeWCHAR, kMixed);
+    wchar_t* wide = nullptr;
+    ASSERT_EQ(s->GetWCHARString(&wide), TOV_OK);
+    wide[0] = L'B';
+    EXPECT_EQ(UTF8Of(s.Get()), u8"Bé€😀");
+    wide[1] = static_cast<wchar_t>(0xD800);  // no scalar value: reads as U+FFFD
+    EXPECT_EQ(UTF16Of(s.Get()), u"B\uFFFD€😀");
+    EXPECT_EQ(s->GetNumCharacters(), 4u);
+    unsigned int cp = 0;
+    EXPECT_EQ(s->GetCharacter(1, &cp), TOV_OK);
+    EXPECT_EQ(cp, 0xFFFDu);
+}
+
+int Sign(int value) { return (value > 0) - (value < 0); }
+
+TEST_F(HostStringTest, ComparesByCodePointWithOrWithoutCase) {
+    struct Case {
+        std::u32string left, right;
+        int caseSensitive, expected;
+    };
+    const Case cases[] = {
+        {U"abc", U"abc", 1, 0},    {U"abc", U"ABC", 1, 1},  {U"abc", U"ABC", 0, 0},   {U"abc", U"abd", 0, -1},
+        {U"ab", U"abc", 1, -1},    {U"", U"", 1, 0},        {U"", U"a", 0, -1},       {U"Été", U"été", 1, -1},
+        {U"Été", U"éTÉ", 0, 0},    {U"ÉA", U"éb", 0, -1},   {U"ΣΑΣ", U"σας", 0, 0},   {U"ΣΑΣ", U"σας", 1, -1},
+        {U"😀", U"\uFFFF", 1, 1},  // code-point order, not UTF-16 unit order
+        {U"straße", U"STRASSE", 0, 1},  // simple folding keeps ß one letter
+    };
+    for (const Case& c : cases) {
+        for (_tovUnicodeType stored : {kTOVUnicodeUTF8, kTOVUnicodeUTF16}) {
+            TOVPtr<ITOVString> left = NewString(stored, c.left);
+            for (int form = 0; form < kForms; ++form) {
+                SCOPED_TRACE(testing::Message() << UnicodeCodec::EncodeUTF8(c.left) << " vs "
+                                                << UnicodeCodec::EncodeUTF8(c.right) << ", case "
+                                                << c.caseSensitive << ", form " << form);
+                int result = 99;
+                ASSERT_EQ(InForm(form, c.right,
+                                 [&](auto p, unsigned int n) { return left->Compare(p, n, &result, c.caseSensitive); }),
+                          TOV_OK);
+                EXPECT_EQ(Sign(result), c.expected);
+            }
+            int result = 99;
+            TOVPtr<ITOVString> right = NewString(kTOVUnicodeUTF32, c.right);
+            ASSERT_EQ(left->Compare(right.Get(), &result, c.caseSensitive), TOV_OK);
+            EXPECT_EQ(Sign(result), c.expected);
+        }
+    }
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, U"a");
+    EXPECT_EQ(s->Compare(L"a", 1, nullptr, 1), TOV_E_INVALIDARG);
+    EXPECT_EQ(s->Compare(s.Get(), nullptr, 0), TOV_E_INVALIDARG);
+}
+
+TEST_F(HostStringTest, ChangesCaseOfEveryLetterItKnows) {
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF16, U"Aé€😀Éσ");
+    ASSERT_EQ(s->ToUpper(), TOV_OK);
+    EXPECT_EQ(WideOf(s.Get()), U"AÉ€😀ÉΣ");
+    ASSERT_EQ(s->ToLower(), TOV_OK);
+    EXPECT_EQ(WideOf(s.Get()), U"aé€😀éσ");
+    EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF16);
+}
+
+TEST_F(HostStringTest, FindsByCharacterIndexForwardAndBackward) {
+    const std::u32string haystack = U"é😀abcé😀abc";  // 10 characters, "abc" at 2 and 7
+    struct Case {
+        std::u32string needle;
+        int start, forward, reverse;
+    };
+    const Case cases[] = {
+        {U"abc", 0, 2, -1},  {U"abc", 2, 2, 2},   {U"abc", 3, 7, 2},   {U"abc", 7, 7, 7},
+        {U"abc", 8, -1, 7},  {U"abc", 10, -1, 7}, {U"abc", 11, -1, 7}, {U"abc", -3, 2, 7},
+        {U"😀a", 0, 1, -1},  {U"😀a", 6, 6, 6},   {U"é", 4, 5, 0},     {U"xyz", 0, -1, -1},
+        {U"", 4, 4, 4},      {U"", 10, 10, 10},   {U"", 11, -1, 10},   {U"", -1, 0, 10},
+        {haystack, 0, 0, 0}, {haystack + U"!", 0, -1, -1},
+    };
+    for (_tovUnicodeType stored : kTypes) {
+        TOVPtr<ITOVString> s = NewString(stored, haystack);
+        for (const Case& c : cases) {
+            for (int form = 0; form <= kForms; ++form) {
+                SCOPED_TRACE(testing::Message() << UnicodeCodec::EncodeUTF8(c.needle) << " from " << c.start
+                                                << ", stored " << stored << ", form " << form);
+                int forward = 99, reverse = 99;
+                if (form == kForms) {  // the needle as a string
+                    TOVPtr<ITOVString> needle = NewString(kTOVUnicodeUTF8, c.needle);
+                    ASSERT_EQ(s->FindString(needle.Get(), c.start, &forward), TOV_OK);
+                    ASSERT_EQ(s->FindStringReverse(needle.Get(), c.start, &reverse), TOV_OK);
+                } else {
+                    ASSERT_EQ(InForm(form, c.needle,
+                                     [&](auto p, unsigned int n) { return s->FindString(p, n, c.start, &forward); }),
+                              TOV_OK);
+                    ASSERT_EQ(InForm(form, c.needle,
+                                     [&](auto p, unsigned int n) {
+                                         return s->FindStringReverse(p, n, c.start, &reverse);
+                                     }),
+                              TOV_OK);
+                }
+                EXPECT_EQ(forward, c.forward);
+                EXPECT_EQ(reverse, c.reverse);
+            }
+        }
+    }
+}
+
+TEST_F(HostStringTest, ReadsOneCharacterInEachForm) {
+    for (_tovUnicodeType stored : kTypes) {
+        SCOPED_TRACE(stored);
+        TOVPtr<ITOVString> s = NewString(stored, kMixed);
+        unsigned char bytes[8] = {};
+        unsigned int size = sizeof bytes;
+        ASSERT_EQ(s->GetCharacter(3, bytes, &size), TOV_OK);
+        EXPECT_EQ(std::string(reinterpret_cast<char*>(bytes), size), u8"😀");
+        size = sizeof bytes;
+        ASSERT_EQ(s->GetCharacter(1, bytes, &size), TOV_OK);
+        EXPECT_EQ(std::string(reinterpret_cast<char*>(bytes), size), u8"é");
+        size = 3;  // one short of the four bytes needed
+        EXPECT_EQ(s->GetCharacter(3, bytes, &size), TOV_E_INVALIDARG);
+        EXPECT_EQ(size, 4u);
+
+        unsigned short units[2] = {};
+        size = 2;
+        ASSERT_EQ(s->GetCharacter(3, units, &size), TOV_OK);
+        EXPECT_EQ(size, 2u);
+        EXPECT_EQ(units[0], 0xD83D);
+        EXPECT_EQ(units[1], 0xDE00);
+        size = 1;
+        EXPECT_EQ(s->GetCharacter(3, units, &size), TOV_E_INVALIDARG);
+        EXPECT_EQ(size, 2u);
+        size = 2;
+        ASSERT_EQ(s->GetCharacter(2, units, &size), TOV_OK);
+        EXPECT_EQ(size, 1u);
+        EXPECT_EQ(units[0], 0x20AC);
+
+        unsigned int cp = 0;
+        ASSERT_EQ(s->GetCharacter(3, &cp), TOV_OK);
+        EXPECT_EQ(cp, 0x1F600u);
+
+        size = sizeof bytes;
+        EXPECT_EQ(s->GetCharacter(4, bytes, &size), TOV_E_OUTOFRANGE);
+        size = 2;
+        EXPECT_EQ(s->GetCharacter(4, units, &size), TOV_E_OUTOFRANGE);
+        EXPECT_EQ(s->GetCharacter(4, &cp), TOV_E_OUTOFRANGE);
+        EXPECT_EQ(s->GetCharacter(0, &cp), TOV_OK);
+        EXPECT_EQ(s->GetCharacter(0, static_cast<unsigned int*>(nullptr)), TOV_E_INVALIDARG);
+    }
+}
+
+TEST_F(HostStringTest, ReplacesOneCharacterInEachForm) {
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, kMixed);
+    ASSERT_EQ(s->SetCharacter(0, Bytes(u8"😀"), 4), TOV_OK);
+    const unsigned short euro[] = {0x20AC, 0};
+    ASSERT_EQ(s->SetCharacter(3, euro, 2), TOV_OK);  // a terminator within size is not text
+    ASSERT_EQ(s->SetCharacter(1, 0x10FFFFu), TOV_OK);
+    EXPECT_EQ(WideOf(s.Get()), U"😀\U0010FFFF€€");
+    EXPECT_EQ(s->GetByteCount(), 4u + 4 + 3 + 3);
+
+    EXPECT_EQ(s->SetCharacter(4, 0x41u), TOV_E_OUTOFRANGE);
+    EXPECT_EQ(s->SetCharacter(4, Bytes("A"), 1), TOV_E_OUTOFRANGE);
+    EXPECT_EQ(WideOf(s.Get()), U"😀\U0010FFFF€€");
+}
+
+TEST_F(HostStringTest, TruncateKeepsTheFirstCharacters) {
+    const struct {
+        unsigned int count;
+        std::u32string expected;
+    } cases[] = {{0, U""}, {2, U"Aé"}, {3, U"Aé€"}, {4, kMixed}, {100, kMixed}};
+    for (const auto& c : cases) {
+        SCOPED_TRACE(c.count);
+        TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF16, kMixed);
+        ASSERT_EQ(s->Truncate(c.count), TOV_OK);
+        EXPECT_EQ(WideOf(s.Get()), c.expected);
+        EXPECT_EQ(s->GetNumCharacters(), c.expected.size());
+        EXPECT_EQ(s->IsEmpty(), c.expected.empty() ? 1 : 0);
+    }
+}
+
+TEST_F(HostStringTest, AppendsAndAssignsInTheStoredEncoding) {
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF16, U"Aé");
+    ASSERT_EQ(s->Append(Bytes(u8"€"), 3), TOV_OK);
+    ASSERT_EQ(s->Append(L"😀", 1), TOV_OK);
+    ASSERT_EQ(s->Append(static_cast<const unsigned int*>(nullptr), 1), TOV_OK);
+    ASSERT_EQ(s->Append(s.Get()), TOV_OK);  // itself
+    EXPECT_EQ(WideOf(s.Get()), kMixed + kMixed);
+    EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF16);
+    EXPECT_EQ(s->GetCodePointCount(), 10u);
+
+    TOVPtr<ITOVString> other = NewString(kTOVUnicodeUTF8, U"ü");
+    ASSERT_EQ(s->Assign(kTOVUnicodeUTF32, other.Get()), TOV_OK);
+    EXPECT_EQ(WideOf(s.Get()), U"ü");
+    EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF32);
+    ASSERT_EQ(s->Assign(kTOVUnicodeUTF8, s.Get()), TOV_OK);
+    EXPECT_EQ(s->GetByteCount(), 2u);
+
+    ASSERT_EQ(s->Clear(), TOV_OK);
+    EXPECT_EQ(s->IsEmpty(), 1);
+    EXPECT_EQ(UTF8Of(s.Get()), "");
+    EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF8);
+}
+
+TEST_F(HostStringTest, ConvertedCopyIsAnIndependentString) {
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, kMixed);
+    TOVPtr<ITOVString> copy;
+    ASSERT_EQ(s->ConvertedCopy(kTOVUnicodeUTF16, copy.OutT()), TOV_OK);
+    EXPECT_NE(copy.Get(), s.Get());
+    EXPECT_EQ(copy->GetUnicodeType(), kTOVUnicodeUTF16);
+    EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF8);
+    ASSERT_EQ(s->Truncate(1), TOV_OK);
+    EXPECT_EQ(WideOf(copy.Get()), kMixed);
+    EXPECT_EQ(copy->GetByteCount(), 10u);
+
+    ITOVString* none = s.Get();
+    EXPECT_EQ(s->ConvertedCopy(static_cast<_tovUnicodeType>(7), &none), TOV_E_INVALIDARG);
+    EXPECT_EQ(none, nullptr);
+    EXPECT_EQ(s->ConvertedCopy(kTOVUnicodeUTF8, nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(copy.Detach()->Release(), 0u);  // the copy came with exactly one reference
+}
+
+TEST_F(HostStringTest, KeepsItsTextInAnExternalBufferWhileItFits) {
+    unsigned char buffer[8];
+    std::memcpy(buffer, "abc\0zzzz", 8);
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeWCHAR, U"old");
+    ASSERT_EQ(s->SetExternalBuffer(kTOVUnicodeUTF8, buffer, sizeof buffer), TOV_OK);
+    EXPECT_EQ(UTF8Of(s.Get()), "abc");
+    EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF8);
+
+    ASSERT_EQ(s->Append(Bytes(u8"dé"), 3), TOV_OK);  // 7 bytes with the terminator
+    EXPECT_STREQ(reinterpret_cast<char*>(buffer), u8"abcdé");
+    EXPECT_EQ(s->Append(Bytes("f"), 1), TOV_E_OUTOFRANGE);  // 9 bytes
+    EXPECT_EQ(s->ConvertTo(kTOVUnicodeUTF16), TOV_E_OUTOFRANGE);  // 12 bytes
+    EXPECT_STREQ(reinterpret_cast<char*>(buffer), u8"abcdé");
+    EXPECT_EQ(UTF8Of(s.Get()), u8"abcdé");
+    EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF8);
+
+    ASSERT_EQ(s->SetCharacter(4, 0x45u), TOV_OK);
+    ASSERT_EQ(s->ToUpper(), TOV_OK);
+    EXPECT_STREQ(reinterpret_cast<char*>(buffer), "ABCDE");
+    ASSERT_EQ(s->ConvertTo(kTOVUnicodeUTF16), TOV_OK);  // 2 * 6 > 8: does not fit
+    FAIL() << "unreachable";
+}
+
+}  // namespace

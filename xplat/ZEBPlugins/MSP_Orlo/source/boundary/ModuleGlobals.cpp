@@ -1,0 +1,3 @@
+#include "boundary/ModuleGlobals.h"
+
+ZEB::ZEBLogger g_logger;
