@@ -6,16 +6,6 @@ TOVRESULT HostComponentDefinition::TOVCreate(ITOVUnknown* host, ITOVUnknown* out
     return TOVCreateComponent<HostComponentDefinition>(host, outer, iid, out);
 }
 
-TOVRESULT HostComponentDefinition::GetAttribute(const _tovUID& attribute, const _tovUID& type, void* out,
-                                                unsigned int size) {
-    return TOVGuarded([&] { return m_Attributes.Get(attribute, type, out, size); });
-}
-
-TOVRESULT HostComponentDefinition::SetAttribute(const _tovUID& attribute, const _tovUID& type, const void* value,
-                                                int size) {
-    return TOVGuarded([&] { return m_Attributes.Set(attribute, type, value, size); });
-}
-
 TOVRESULT HostComponentDefinition::Initialize(const _tovUID& compID, const _tovUID& compType, unsigned int major,
                                               unsigned int minor, const _tovUID& clsid, const wchar_t* name) {
     return TOVGuarded([&] {

@@ -6,16 +6,6 @@ TOVRESULT HostPluginDefinition::TOVCreate(ITOVUnknown* host, ITOVUnknown* outer,
     return TOVCreateComponent<HostPluginDefinition>(host, outer, iid, out);
 }
 
-TOVRESULT HostPluginDefinition::GetAttribute(const _tovUID& attribute, const _tovUID& type, void* out,
-                                             unsigned int size) {
-    return TOVGuarded([&] { return m_Attributes.Get(attribute, type, out, size); });
-}
-
-TOVRESULT HostPluginDefinition::SetAttribute(const _tovUID& attribute, const _tovUID& type, const void* value,
-                                             int size) {
-    return TOVGuarded([&] { return m_Attributes.Set(attribute, type, value, size); });
-}
-
 TOVRESULT HostPluginDefinition::Initialize(const _tovUID& pluginID, unsigned int major, unsigned int minor,
                                            const wchar_t* name, const _tovUID& vendorID, const wchar_t* vendorName,
                                            unsigned int componentCount, unsigned int flags) {

@@ -3,19 +3,15 @@
 #include <string>
 
 #include "tov/ITOVPluginDefinition.h"
-#include "tov/host/DefinitionAttributes.h"
-#include "tov/sdk/CTOVUnknown.h"
+#include "tov/host/HostDefinition.h"
 
 inline constexpr _tovUID CLSID_HostPluginDefinition = {0xBA8ECAE5, 0xE1C4, 0x4FCF, {0x98, 0xCF, 0x17, 0xE1, 0x92, 0x77, 0x4A, 0x8D}};
 
-class HostPluginDefinition : public ITOVPluginDefinition, public CTOVUnknown {
+class HostPluginDefinition : public HostDefinition<ITOVPluginDefinition> {
 public:
     static TOVRESULT TOVCreate(ITOVUnknown* host, ITOVUnknown* outer, const _tovUID& iid, void** out);
-    explicit HostPluginDefinition(ITOVUnknown* outer) : CTOVUnknown(outer) {}
+    explicit HostPluginDefinition(ITOVUnknown* outer) : HostDefinition(outer) {}
 
-    TOV_FORWARD_UNKNOWN
-    TOVRESULT GetAttribute(const _tovUID& attribute, const _tovUID& type, void* out, unsigned int size) override;
-    TOVRESULT SetAttribute(const _tovUID& attribute, const _tovUID& type, const void* value, int size) override;
     TOVRESULT Initialize(const _tovUID& pluginID, unsigned int major, unsigned int minor, const wchar_t* name,
                          const _tovUID& vendorID, const wchar_t* vendorName, unsigned int componentCount,
                          unsigned int flags) override;
@@ -30,7 +26,6 @@ public:
     unsigned int GetMinor() const { return m_Minor; }
 
 private:
-    DefinitionAttributes m_Attributes;
     _tovUID m_PluginID{};
     _tovUID m_VendorID{};
     std::wstring m_Name;
