@@ -1,9 +1,10 @@
 #include "tov/host/HostString.h"
 
-#include <algorithm>
-#include <cstring>
 #include <locale.h>
 #include <wctype.h>
+
+#include <algorithm>
+#include <cstring>
 
 #include "tov/host/UnicodeCodec.h"
 #include "tov/sdk/TOVComponent.h"
@@ -468,6 +469,5 @@ std::vector<unsigned char> HostString::EncodeBytes(const std::u32string& text, _
 }
 
 bool HostString::IsKnownType(_tovUnicodeType type) {
-    return type == kTOVUnicodeUTF8 || type == kTOVUnicodeUTF16 || type == kTOVUnicodeUTF32 ||
-           type == kTOVUnicodeWCHAR;
+    return type == kTOVUnicodeUTF8 || type == kTOVUnicodeUTF16 || type == kTOVUnicodeUTF32 || type == kTOVUnicodeWCHAR;
 }

@@ -30,10 +30,14 @@ TOVRESULT InForm(int form, std::u32string_view text, Op op) {
     const std::vector<unsigned int> utf32 = UnicodeCodec::EncodeUTF32(text);
     const std::wstring wide(text.begin(), text.end());
     switch (form) {
-        case 0: return op(Bytes(utf8.c_str()), static_cast<unsigned int>(utf8.size()));
-        case 1: return op(utf16.data(), static_cast<unsigned int>(utf16.size()));
-        case 2: return op(utf32.data(), static_cast<unsigned int>(utf32.size()));
-        default: return op(wide.c_str(), static_cast<unsigned int>(wide.size()));
+        case 0:
+            return op(Bytes(utf8.c_str()), static_cast<unsigned int>(utf8.size()));
+        case 1:
+            return op(utf16.data(), static_cast<unsigned int>(utf16.size()));
+        case 2:
+            return op(utf32.data(), static_cast<unsigned int>(utf32.size()));
+        default:
+            return op(wide.c_str(), static_cast<unsigned int>(wide.size()));
     }
 }
 
@@ -116,8 +120,7 @@ TEST_F(HostStringTest, ConvertsBetweenEveryEncodingAndForm) {
         for (_tovUnicodeType stored : kTypes) {
             SCOPED_TRACE(testing::Message() << "form " << form << ", stored " << stored);
             TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, U"old");
-            ASSERT_EQ(InForm(form, kMixed, [&](auto p, unsigned int n) { return s->Assign(stored, p, n); }),
-                      TOV_OK);
+            ASSERT_EQ(InForm(form, kMixed, [&](auto p, unsigned int n) { return s->Assign(stored, p, n); }), TOV_OK);
             for (_tovUnicodeType target : kTypes) {
                 ASSERT_EQ(s->ConvertTo(target), TOV_OK);
                 EXPECT_EQ(s->GetUnicodeType(), target);
@@ -165,7 +168,6 @@ TEST_F(HostStringTest, RefusesMalformedInputAndKeepsTheText) {
     struct Case {
         const char* name;
         std::function<TOVRESULT(ITOVString*)> op;
-        TOVRESULT expected;
     };
     const Case cases[] = {
         {"overlong UTF-8", [](ITOVString* s) { return s->Assign(kTOVUnicodeUTF8, Bytes("\xC0\x80"), 2); }},
@@ -177,10 +179,11 @@ TEST_F(HostStringTest, RefusesMalformedInputAndKeepsTheText) {
         {"above 0x10FFFF", [&](ITOVString* s) { return s->Assign(kTOVUnicodeUTF32, tooLarge, 1); }},
         {"UTF-32 surrogate", [&](ITOVString* s) { return s->Append(surrogate, 1); }},
         {"wide surrogate", [&](ITOVString* s) { return s->Assign(kTOVUnicodeWCHAR, wideSurrogate, 2); }},
-        {"null text with n 2", [](ITOVString* s) { return s->Assign(kTOVUnicodeUTF8, (const wchar_t*)nullptr, 2); }},
+        {"null text with n 2",
+         [](ITOVString* s) { return s->Assign(kTOVUnicodeUTF8, static_cast<const wchar_t*>(nullptr), 2); }},
         {"unknown type 0", [](ITOVString* s) { return s->Assign(static_cast<_tovUnicodeType>(0), L"x", 1); }},
         {"unknown type 5", [](ITOVString* s) { return s->ConvertTo(static_cast<_tovUnicodeType>(5)); }},
-        {"null source", [](ITOVString* s) { return s->Assign(kTOVUnicodeUTF8, (ITOVString*)nullptr); }},
+        {"null source", [](ITOVString* s) { return s->Assign(kTOVUnicodeUTF8, static_cast<ITOVString*>(nullptr)); }},
         {"set a partial character", [](ITOVString* s) { return s->SetCharacter(1, Bytes("\xC3"), 1); }},
         {"set two characters", [](ITOVString* s) { return s->SetCharacter(1, Bytes("ab"), 2); }},
         {"set a lone surrogate", [&](ITOVString* s) { return s->SetCharacter(1, loneLow, 1); }},
@@ -234,19 +237,19 @@ TEST_F(HostStringTest, ComparesByCodePointWithOrWithoutCase) {
         int caseSensitive, expected;
     };
     const Case cases[] = {
-        {U"abc", U"abc", 1, 0},    {U"abc", U"ABC", 1, 1},  {U"abc", U"ABC", 0, 0},   {U"abc", U"abd", 0, -1},
-        {U"ab", U"abc", 1, -1},    {U"", U"", 1, 0},        {U"", U"a", 0, -1},       {U"Été", U"été", 1, -1},
-        {U"Été", U"éTÉ", 0, 0},    {U"ÉA", U"éb", 0, -1},   {U"ΣΑΣ", U"σας", 0, 0},   {U"ΣΑΣ", U"σας", 1, -1},
-        {U"😀", U"\uFFFF", 1, 1},  // code-point order, not UTF-16 unit order
+        {U"abc", U"abc", 1, 0},        {U"abc", U"ABC", 1, 1}, {U"abc", U"ABC", 0, 0}, {U"abc", U"abd", 0, -1},
+        {U"ab", U"abc", 1, -1},        {U"", U"", 1, 0},       {U"", U"a", 0, -1},     {U"Été", U"été", 1, -1},
+        {U"Été", U"éTÉ", 0, 0},        {U"ÉA", U"éb", 0, -1},  {U"ΣΑΣ", U"σας", 0, 0}, {U"ΣΑΣ", U"σας", 1, -1},
+        {U"😀", U"\uFFFF", 1, 1},        // code-point order, not UTF-16 unit order
         {U"straße", U"STRASSE", 0, 1},  // simple folding keeps ß one letter
     };
     for (const Case& c : cases) {
         for (_tovUnicodeType stored : {kTOVUnicodeUTF8, kTOVUnicodeUTF16}) {
             TOVPtr<ITOVString> left = NewString(stored, c.left);
             for (int form = 0; form < kForms; ++form) {
-                SCOPED_TRACE(testing::Message() << UnicodeCodec::EncodeUTF8(c.left) << " vs "
-                                                << UnicodeCodec::EncodeUTF8(c.right) << ", case "
-                                                << c.caseSensitive << ", form " << form);
+                SCOPED_TRACE(testing::Message()
+                             << UnicodeCodec::EncodeUTF8(c.left) << " vs " << UnicodeCodec::EncodeUTF8(c.right)
+                             << ", case " << c.caseSensitive << ", form " << form);
                 int result = 99;
                 ASSERT_EQ(InForm(form, c.right,
                                  [&](auto p, unsigned int n) { return left->Compare(p, n, &result, c.caseSensitive); }),
@@ -280,11 +283,12 @@ TEST_F(HostStringTest, FindsByCharacterIndexForwardAndBackward) {
         int start, forward, reverse;
     };
     const Case cases[] = {
-        {U"abc", 0, 2, -1},  {U"abc", 2, 2, 2},   {U"abc", 3, 7, 2},   {U"abc", 7, 7, 7},
-        {U"abc", 8, -1, 7},  {U"abc", 10, -1, 7}, {U"abc", 11, -1, 7}, {U"abc", -3, 2, 7},
-        {U"😀a", 0, 1, -1},  {U"😀a", 6, 6, 6},   {U"é", 4, 5, 0},     {U"xyz", 0, -1, -1},
-        {U"", 4, 4, 4},      {U"", 10, 10, 10},   {U"", 11, -1, 10},   {U"", -1, 0, 10},
-        {haystack, 0, 0, 0}, {haystack + U"!", 0, -1, -1},
+        {U"abc", 0, 2, -1},  {U"abc", 2, 2, 2},   {U"abc", 3, 7, 2},
+        {U"abc", 7, 7, 7},   {U"abc", 8, -1, 7},  {U"abc", 10, -1, 7},
+        {U"abc", 11, -1, 7}, {U"abc", -3, 2, 7},  {U"😀a", 0, 1, -1},
+        {U"😀a", 6, 6, 6},    {U"é", 4, 5, 0},     {U"xyz", 0, -1, -1},
+        {U"", 4, 4, 4},      {U"", 10, 10, 10},   {U"", 11, -1, 10},
+        {U"", -1, 0, 10},    {haystack, 0, 0, 0}, {haystack + U"!", 0, -1, -1},
     };
     for (_tovUnicodeType stored : kTypes) {
         TOVPtr<ITOVString> s = NewString(stored, haystack);
@@ -301,11 +305,10 @@ TEST_F(HostStringTest, FindsByCharacterIndexForwardAndBackward) {
                     ASSERT_EQ(InForm(form, c.needle,
                                      [&](auto p, unsigned int n) { return s->FindString(p, n, c.start, &forward); }),
                               TOV_OK);
-                    ASSERT_EQ(InForm(form, c.needle,
-                                     [&](auto p, unsigned int n) {
-                                         return s->FindStringReverse(p, n, c.start, &reverse);
-                                     }),
-                              TOV_OK);
+                    ASSERT_EQ(
+                        InForm(form, c.needle,
+                               [&](auto p, unsigned int n) { return s->FindStringReverse(p, n, c.start, &reverse); }),
+                        TOV_OK);
                 }
                 EXPECT_EQ(forward, c.forward);
                 EXPECT_EQ(reverse, c.reverse);
@@ -315,45 +318,40 @@ TEST_F(HostStringTest, FindsByCharacterIndexForwardAndBackward) {
 }
 
 TEST_F(HostStringTest, ReadsOneCharacterInEachForm) {
+    const struct {
+        unsigned int index;
+        std::string utf8;
+        std::vector<unsigned short> utf16;
+    } cases[] = {{0, "A", {0x41}}, {1, u8"é", {0xE9}}, {2, u8"€", {0x20AC}}, {3, u8"😀", {0xD83D, 0xDE00}}};
     for (_tovUnicodeType stored : kTypes) {
-        SCOPED_TRACE(stored);
         TOVPtr<ITOVString> s = NewString(stored, kMixed);
-        unsigned char bytes[8] = {};
-        unsigned int size = sizeof bytes;
-        ASSERT_EQ(s->GetCharacter(3, bytes, &size), TOV_OK);
-        EXPECT_EQ(std::string(reinterpret_cast<char*>(bytes), size), u8"😀");
-        size = sizeof bytes;
-        ASSERT_EQ(s->GetCharacter(1, bytes, &size), TOV_OK);
-        EXPECT_EQ(std::string(reinterpret_cast<char*>(bytes), size), u8"é");
-        size = 3;  // one short of the four bytes needed
-        EXPECT_EQ(s->GetCharacter(3, bytes, &size), TOV_E_INVALIDARG);
-        EXPECT_EQ(size, 4u);
+        unsigned char bytes[4];
+        unsigned short units[2];
+        unsigned int size = 0, cp = 0;
+        for (const auto& c : cases) {
+            SCOPED_TRACE(testing::Message() << "stored " << stored << ", index " << c.index);
+            size = sizeof bytes;
+            ASSERT_EQ(s->GetCharacter(c.index, bytes, &size), TOV_OK);
+            EXPECT_EQ(std::string(bytes, bytes + size), c.utf8);
+            size = 2;
+            ASSERT_EQ(s->GetCharacter(c.index, units, &size), TOV_OK);
+            EXPECT_EQ(std::vector<unsigned short>(units, units + size), c.utf16);
+            ASSERT_EQ(s->GetCharacter(c.index, &cp), TOV_OK);
+            EXPECT_EQ(cp, kMixed[c.index]);
 
-        unsigned short units[2] = {};
-        size = 2;
-        ASSERT_EQ(s->GetCharacter(3, units, &size), TOV_OK);
-        EXPECT_EQ(size, 2u);
-        EXPECT_EQ(units[0], 0xD83D);
-        EXPECT_EQ(units[1], 0xDE00);
-        size = 1;
-        EXPECT_EQ(s->GetCharacter(3, units, &size), TOV_E_INVALIDARG);
-        EXPECT_EQ(size, 2u);
-        size = 2;
-        ASSERT_EQ(s->GetCharacter(2, units, &size), TOV_OK);
-        EXPECT_EQ(size, 1u);
-        EXPECT_EQ(units[0], 0x20AC);
-
-        unsigned int cp = 0;
-        ASSERT_EQ(s->GetCharacter(3, &cp), TOV_OK);
-        EXPECT_EQ(cp, 0x1F600u);
-
+            // One unit short: refused, with the units needed.
+            size = static_cast<unsigned int>(c.utf8.size()) - 1;
+            EXPECT_EQ(s->GetCharacter(c.index, bytes, &size), TOV_E_INVALIDARG);
+            EXPECT_EQ(size, c.utf8.size());
+            size = static_cast<unsigned int>(c.utf16.size()) - 1;
+            EXPECT_EQ(s->GetCharacter(c.index, units, &size), TOV_E_INVALIDARG);
+            EXPECT_EQ(size, c.utf16.size());
+        }
         size = sizeof bytes;
         EXPECT_EQ(s->GetCharacter(4, bytes, &size), TOV_E_OUTOFRANGE);
         size = 2;
         EXPECT_EQ(s->GetCharacter(4, units, &size), TOV_E_OUTOFRANGE);
         EXPECT_EQ(s->GetCharacter(4, &cp), TOV_E_OUTOFRANGE);
-        EXPECT_EQ(s->GetCharacter(0, &cp), TOV_OK);
-        EXPECT_EQ(s->GetCharacter(0, static_cast<unsigned int*>(nullptr)), TOV_E_INVALIDARG);
     }
 }
 
@@ -437,7 +435,7 @@ TEST_F(HostStringTest, KeepsItsTextInAnExternalBufferWhileItFits) {
 
     ASSERT_EQ(s->Append(Bytes(u8"dé"), 3), TOV_OK);  // 7 bytes with the terminator
     EXPECT_STREQ(reinterpret_cast<char*>(buffer), u8"abcdé");
-    EXPECT_EQ(s->Append(Bytes("f"), 1), TOV_E_OUTOFRANGE);  // 9 bytes
+    EXPECT_EQ(s->Append(Bytes("fg"), 2), TOV_E_OUTOFRANGE);       // 9 bytes
     EXPECT_EQ(s->ConvertTo(kTOVUnicodeUTF16), TOV_E_OUTOFRANGE);  // 12 bytes
     EXPECT_STREQ(reinterpret_cast<char*>(buffer), u8"abcdé");
     EXPECT_EQ(UTF8Of(s.Get()), u8"abcdé");
@@ -446,8 +444,108 @@ TEST_F(HostStringTest, KeepsItsTextInAnExternalBufferWhileItFits) {
     ASSERT_EQ(s->SetCharacter(4, 0x45u), TOV_OK);
     ASSERT_EQ(s->ToUpper(), TOV_OK);
     EXPECT_STREQ(reinterpret_cast<char*>(buffer), "ABCDE");
-    ASSERT_EQ(s->ConvertTo(kTOVUnicodeUTF16), TOV_OK);  // 2 * 6 > 8: does not fit
-    FAIL() << "unreachable";
+    ASSERT_EQ(s->Truncate(2), TOV_OK);
+    ASSERT_EQ(s->ConvertTo(kTOVUnicodeUTF16), TOV_OK);  // the buffer follows the stored encoding
+    const unsigned char utf16[] = {'A', 0, 'B', 0, 0, 0};
+    EXPECT_EQ(std::memcmp(buffer, utf16, sizeof utf16), 0);
+
+    unsigned char* handedBack = nullptr;
+    ASSERT_EQ(s->RemoveExternalBuffer(&handedBack), TOV_OK);
+    EXPECT_EQ(handedBack, buffer);
+    ASSERT_EQ(s->Append(Bytes("CDEFGHIJ"), 8), TOV_OK);  // no longer bound by the buffer
+    EXPECT_EQ(UTF8Of(s.Get()), "ABCDEFGHIJ");
+    EXPECT_EQ(std::memcmp(buffer, utf16, sizeof utf16), 0);
+    EXPECT_EQ(s->RemoveExternalBuffer(&handedBack), ZEB_E_NOTREADY);
+    EXPECT_EQ(handedBack, nullptr);
+}
+
+TEST_F(HostStringTest, RefusesExternalBuffersItCannotUse) {
+    unsigned char noTerminator[4] = {'a', 'b', 'c', 'd'};
+    unsigned char malformed[4] = {0xC3, 0, 0, 0};
+    unsigned char oddSize[3] = {'a', 0, 0};  // a UTF-16 terminator needs two bytes
+    unsigned char good[4] = {'a', 0, 0, 0};
+    unsigned char empty[4] = {};
+    const struct {
+        const char* name;
+        _tovUnicodeType type;
+        unsigned char* buffer;
+        unsigned int size;
+    } cases[] = {
+        {"null buffer", kTOVUnicodeUTF8, nullptr, 8},
+        {"unknown type", static_cast<_tovUnicodeType>(9), good, sizeof good},
+        {"no terminator", kTOVUnicodeUTF8, noTerminator, sizeof noTerminator},
+        {"malformed text", kTOVUnicodeUTF8, malformed, sizeof malformed},
+        {"no terminator in units", kTOVUnicodeUTF16, oddSize, sizeof oddSize},
+        {"no terminator for UTF-32", kTOVUnicodeUTF32, good, 3},
+    };
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeWCHAR, kMixed);
+    for (const auto& c : cases) {
+        SCOPED_TRACE(c.name);
+        EXPECT_EQ(s->SetExternalBuffer(c.type, c.buffer, c.size), TOV_E_INVALIDARG);
+        EXPECT_EQ(WideOf(s.Get()), kMixed);
+        EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeWCHAR);
+    }
+    ASSERT_EQ(s->SetExternalBuffer(kTOVUnicodeUTF32, empty, sizeof empty), TOV_OK);
+    EXPECT_EQ(WideOf(s.Get()), U"");
+    EXPECT_EQ(s->SetExternalBuffer(kTOVUnicodeUTF8, noTerminator, sizeof noTerminator), ZEB_E_ALREADYSET);
+    EXPECT_EQ(s->RemoveExternalBuffer(nullptr), TOV_E_INVALIDARG);
+    unsigned char* handedBack = nullptr;
+    EXPECT_EQ(s->RemoveExternalBuffer(&handedBack), TOV_OK);
+    EXPECT_EQ(handedBack, empty);
+}
+
+TEST_F(HostStringTest, ExternalTextNeedsNoAlignmentAndMayNotGrowPastTheBuffer) {
+    // U+0250 has an upper case that takes three UTF-8 bytes instead of two.
+    alignas(4) unsigned char raw[7] = {};
+    unsigned char* unaligned = raw + 1;
+    const unsigned short text[] = {0x0250, 0x41, 0};
+    std::memcpy(unaligned, text, sizeof text);
+    TOVPtr<ITOVString> wide = NewString(kTOVUnicodeUTF8, U"");
+    ASSERT_EQ(wide->SetExternalBuffer(kTOVUnicodeUTF16, unaligned, sizeof text), TOV_OK);
+    EXPECT_EQ(WideOf(wide.Get()), U"\u0250A");
+    ASSERT_EQ(wide->ToUpper(), TOV_OK);
+    unsigned short units[3] = {};
+    std::memcpy(units, unaligned, sizeof units);
+    EXPECT_EQ(units[0], 0x2C6F);
+    EXPECT_EQ(units[1], 0x41);
+    EXPECT_EQ(units[2], 0);
+    EXPECT_EQ(wide->Append(L"b", 1), TOV_E_OUTOFRANGE);
+
+    unsigned char utf8[3] = {0xC9, 0x90, 0};
+    TOVPtr<ITOVString> narrow = NewString(kTOVUnicodeUTF8, U"");
+    ASSERT_EQ(narrow->SetExternalBuffer(kTOVUnicodeUTF8, utf8, sizeof utf8), TOV_OK);
+    EXPECT_EQ(narrow->ToUpper(), TOV_E_OUTOFRANGE);
+    EXPECT_EQ(WideOf(narrow.Get()), U"\u0250");
+    EXPECT_EQ(utf8[0], 0xC9);
+    EXPECT_EQ(utf8[1], 0x90);
+}
+
+TEST_F(HostStringTest, RefusesNullPointers) {
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, U"a");
+    unsigned char byte = 0;
+    unsigned int size = 1;
+    int position = 0;
+    const struct {
+        const char* name;
+        std::function<TOVRESULT()> op;
+    } cases[] = {
+        {"UTF-8 view", [&] { return s->GetUTF8String(nullptr); }},
+        {"UTF-16 view", [&] { return s->GetUTF16String(nullptr); }},
+        {"UTF-32 view", [&] { return s->GetUTF32String(nullptr); }},
+        {"wide view", [&] { return s->GetWCHARString(nullptr); }},
+        {"find position", [&] { return s->FindString(L"a", 1, 0, nullptr); }},
+        {"reverse position", [&] { return s->FindStringReverse(Bytes("a"), 1, 0, nullptr); }},
+        {"find in null", [&] { return s->FindString(static_cast<ITOVString*>(nullptr), 0, &position); }},
+        {"append null", [&] { return s->Append(static_cast<ITOVString*>(nullptr)); }},
+        {"compare null", [&] { return s->Compare(static_cast<ITOVString*>(nullptr), &position, 1); }},
+        {"character into null", [&] { return s->GetCharacter(0, static_cast<unsigned char*>(nullptr), &size); }},
+        {"character size null", [&] { return s->GetCharacter(0, &byte, nullptr); }},
+    };
+    for (const auto& c : cases) {
+        SCOPED_TRACE(c.name);
+        EXPECT_EQ(c.op(), TOV_E_INVALIDARG);
+    }
+    EXPECT_EQ(UTF8Of(s.Get()), "a");
 }
 
 }  // namespace
