@@ -3,6 +3,9 @@
 #include "tov/host/HostComponentDefinition.h"
 #include "tov/host/HostPluginDefinition.h"
 #include "tov/host/HostString.h"
+#include "tov/host/HostXmlParser.h"
+#include "tov/host/HostXmlSaxParser.h"
+#include "tov/host/HostXmlWriter.h"
 #include "tov/sdk/TOVComponent.h"
 
 namespace {
@@ -21,6 +24,12 @@ TOVPtr<TOVHost> TOVHost::Create() {
     TOVCheck(host->RegisterBuiltin(TOVCompID_ComponentDefinition, CLSID_HostComponentDefinition,
                                    L"ComponentDefinition", HostComponentDefinition::TOVCreate));
     TOVCheck(host->RegisterBuiltin(TOVCompID_TOVString, CLSID_HostString, L"TOVString", HostString::TOVCreate));
+    TOVCheck(host->RegisterBuiltin(UTIL::CompID_TOVXmlReader, CLSID_HostXmlParser, L"TOVXmlReader",
+                                   HostXmlParser::TOVCreate));
+    TOVCheck(host->RegisterBuiltin(UTIL::CompID_TOVXmlSaxReader, CLSID_HostXmlSaxParser, L"TOVXmlSaxReader",
+                                   HostXmlSaxParser::TOVCreate));
+    TOVCheck(host->RegisterBuiltin(UTIL::CompID_TOVXmlWriter, CLSID_HostXmlWriter, L"TOVXmlWriter",
+                                   HostXmlWriter::TOVCreate));
     return host;
 }
 

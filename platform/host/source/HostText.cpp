@@ -1,0 +1,32 @@
+#include "tov/host/HostText.h"
+
+#include "tov/host/HostString.h"
+#include "tov/sdk/TOVFailureStyle.h"
+#include "tov/sdk/TOVPtr.h"
+
+namespace HostText {
+
+TOVRESULT Make(const std::string& utf8, ITOVString** out) {
+    if (!out) return TOV_E_INVALIDARG;
+    *out = nullptr;
+    TOVPtr<ITOVString> text;
+    // The string component needs no host services, so it is made directly.
+    TOVRESULT result = HostString::TOVCreate(nullptr, nullptr, IID_ITOVString, text.Out());
+    if (result < 0) return result;
+    result = text->Assign(kTOVUnicodeUTF8, reinterpret_cast<const unsigned char*>(utf8.data()),
+                          static_cast<unsigned int>(utf8.size()));
+    if (result < 0) return result;
+    *out = text.Detach();
+    return TOV_OK;
+}
+
+std::string Read(ITOVString* text) {
+    if (!text) throw static_cast<int>(TOV_E_POINTER);
+    TOVPtr<ITOVString> copy;
+    TOVCheck(text->ConvertedCopy(kTOVUnicodeUTF8, copy.OutT()));
+    const unsigned char* bytes = nullptr;
+    TOVCheck(copy->GetUTF8String(&bytes));
+    return std::string(reinterpret_cast<const char*>(bytes), copy->GetByteCount());
+}
+
+}  // namespace HostText

@@ -1,0 +1,128 @@
+#include "tov/host/HostXmlNodeBase.h"
+
+#include <string>
+
+#include "tov/host/HostText.h"
+#include "tov/host/HostXmlDomAttribute.h"
+#include "tov/host/HostXmlDomElement.h"
+#include "tov/host/HostXmlDomNode.h"
+#include "tov/host/HostXmlDomNodeList.h"
+#include "tov/sdk/TOVComponent.h"
+#include "tov/sdk/TOVPtr.h"
+
+namespace {
+
+std::string QualifiedName(xmlNodePtr node) {
+    std::string name = node->name ? reinterpret_cast<const char*>(node->name) : "";
+    if (node->ns && node->ns->prefix) name = std::string(reinterpret_cast<const char*>(node->ns->prefix)) + ":" + name;
+    return name;
+}
+
+std::string NodeName(xmlNodePtr node) {
+    switch (node->type) {
+        case XML_ELEMENT_NODE:
+        case XML_ATTRIBUTE_NODE:
+            return QualifiedName(node);
+        case XML_TEXT_NODE:
+            return "#text";
+        case XML_CDATA_SECTION_NODE:
+            return "#cdata-section";
+        case XML_COMMENT_NODE:
+            return "#comment";
+        default:
+            return node->name ? reinterpret_cast<const char*>(node->name) : "";
+    }
+}
+
+std::string NodeValue(xmlDocPtr document, xmlNodePtr node) {
+    if (node->type == XML_ATTRIBUTE_NODE) {
+        xmlChar* value = xmlNodeListGetString(document, node->children, 1);
+        std::string text = value ? reinterpret_cast<const char*>(value) : "";
+        xmlFree(value);
+        return text;
+    }
+    if (node->type == XML_ELEMENT_NODE || !node->content) return std::string();
+    return reinterpret_cast<const char*>(node->content);
+}
+
+template <class View>
+TOVRESULT MakeView(const HostXmlDocumentRef& document, xmlNodePtr node, UTIL::ITOVXmlDomNode** out) {
+    TOVPtr<UTIL::ITOVXmlDomNode> view;
+    TOVCheck(TOVCreateComponent<View>(nullptr, nullptr, UTIL::IID_ITOVXmlDomNode, view.Out()));
+    static_cast<View*>(view.Get())->Attach(document, node);
+    *out = view.Detach();
+    return TOV_OK;
+}
+
+}  // namespace
+
+namespace HostXmlNodes {
+
+TOVRESULT Wrap(const HostXmlDocumentRef& document, xmlNodePtr node, UTIL::ITOVXmlDomNode** out) {
+    return TOVGuarded([&] {
+        if (!out) return TOV_E_INVALIDARG;
+        *out = nullptr;
+        if (!node) return TOV_E_POINTER;
+        if (node->type == XML_ELEMENT_NODE) return MakeView<HostXmlDomElement>(document, node, out);
+        if (node->type == XML_ATTRIBUTE_NODE) return MakeView<HostXmlDomAttribute>(document, node, out);
+        return MakeView<HostXmlDomNode>(document, node, out);
+    });
+}
+
+}  // namespace HostXmlNodes
+
+template <class Interface, const _tovUID& ViewIID>
+TOVRESULT HostXmlNodeBase<Interface, ViewIID>::GetName(ITOVString** out) {
+    return TOVGuarded([&] { return HostText::Make(NodeName(m_Node), out); });
+}
+
+template <class Interface, const _tovUID& ViewIID>
+TOVRESULT HostXmlNodeBase<Interface, ViewIID>::GetValue(ITOVString** out) {
+    return TOVGuarded([&] { return HostText::Make(NodeValue(m_Document.get(), m_Node), out); });
+}
+
+template <class Interface, const _tovUID& ViewIID>
+const std::vector<xmlNodePtr>& HostXmlNodeBase<Interface, ViewIID>::Children() {
+    if (!m_HaveChildren) {
+        // Attributes are not children, and an attribute's own children are its value.
+        if (m_Node->type != XML_ATTRIBUTE_NODE)
+            for (xmlNodePtr child = m_Node->children; child; child = child->next) m_Children.push_back(child);
+        m_HaveChildren = true;
+    }
+    return m_Children;
+}
+
+template <class Interface, const _tovUID& ViewIID>
+TOVRESULT HostXmlNodeBase<Interface, ViewIID>::GetChild(uint32_t index, UTIL::ITOVXmlDomNode** out) {
+    return TOVGuarded([&] {
+        if (!out) return TOV_E_INVALIDARG;
+        *out = nullptr;
+        const std::vector<xmlNodePtr>& children = Children();
+        if (index >= children.size()) return TOV_E_OUTOFRANGE;
+        return HostXmlNodes::Wrap(m_Document, children[index], out);
+    });
+}
+
+template <class Interface, const _tovUID& ViewIID>
+TOVRESULT HostXmlNodeBase<Interface, ViewIID>::GetAttributes(UTIL::ITOVXmlDomNodeList** out) {
+    return TOVGuarded([&] {
+        if (!out) return TOV_E_INVALIDARG;
+        std::vector<xmlNodePtr> attributes;
+        if (m_Node->type == XML_ELEMENT_NODE)
+            for (xmlAttrPtr a = m_Node->properties; a; a = a->next) attributes.push_back(reinterpret_cast<xmlNodePtr>(a));
+        return HostXmlDomNodeList::Create(m_Document, std::move(attributes), out);
+    });
+}
+
+template <class Interface, const _tovUID& ViewIID>
+TOVRESULT HostXmlNodeBase<Interface, ViewIID>::InternalQueryInterface(const _tovUID& iid, void** out) {
+    return TOVGuarded([&] {
+        if (!out) return TOV_E_INVALIDARG;
+        if (iid == UTIL::IID_ITOVXmlDomNode || iid == ViewIID) return TOVExpose<Interface>(this, out);
+        return CTOVUnknown::InternalQueryInterface(iid, out);
+    });
+}
+
+template class HostXmlNodeBase<UTIL::ITOVXmlDomNode, UTIL::IID_ITOVXmlDomNode>;
+template class HostXmlNodeBase<UTIL::ITOVXmlDomElement, UTIL::IID_ITOVXmlDomElement>;
+template class HostXmlNodeBase<UTIL::ITOVXmlDomAttribute, UTIL::IID_ITOVXmlDomAttribute>;
