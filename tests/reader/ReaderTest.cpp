@@ -1,0 +1,35 @@
+#include "ReaderTest.h"
+
+#include <dirent.h>
+
+#include "TempFile.h"
+#include "startup/ZEBUtilLib.h"
+
+void ReaderTest::SetUp() {
+    ASSERT_EQ(ZEB::ZEBInitialize(host.Get()), TOV_OK);
+    host.ClearLines();
+}
+
+void ReaderTest::TearDown() { ZEB::ZEBTerminate(); }
+
+std::unique_ptr<Orlo::OrloStream> ReaderTest::Open(const std::string& bytes) {
+    TempFile file(bytes);
+    const int before = OpenDescriptorCount();
+    auto stream = std::make_unique<Orlo::OrloStream>(file.Path().c_str(), 255);
+    EXPECT_EQ(OpenDescriptorCount(), before) << "the stream must close its file on every path";
+    return stream;
+}
+
+std::string ReaderTest::ErrorOf(const std::string& bytes) {
+    const char* error = Open(bytes)->GetError();
+    return error ? error : "";
+}
+
+int OpenDescriptorCount() {
+    DIR* folder = opendir("/proc/self/fd");
+    if (!folder) return -1;
+    int count = 0;
+    while (readdir(folder)) ++count;
+    closedir(folder);
+    return count;
+}

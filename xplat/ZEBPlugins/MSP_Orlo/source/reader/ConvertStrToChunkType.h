@@ -1,0 +1,11 @@
+#pragma once
+/// Which supported chunk an identifier names.
+#include <string>
+
+namespace Orlo {
+
+/// The `OrloStream::SupportedChunks` value of `id`, or 0 for an unknown chunk.
+/// Whole, case-sensitive matches only: "FMT " or "ixml" are unknown.
+unsigned int ConvertStrToChunkType(const std::string& id);
+
+}  // namespace Orlo

@@ -1,0 +1,181 @@
+#include "reader/OrloStream.h"
+
+#include <cstring>
+#include <stdexcept>
+
+#include "reader/BEXTChunk.h"
+#include "reader/COMMChunk.h"
+#include "reader/CalcBytesRemaining.h"
+#include "reader/ConvertStrToChunkType.h"
+#include "reader/DATAChunk.h"
+#include "reader/DS64Chunk.h"
+#include "reader/FMTChunk.h"
+#include "reader/PerformAdditionalInitialization.h"
+#include "reader/ReadBytes.h"
+#include "reader/ReadValue.h"
+#include "reader/SSNDChunk.h"
+#include "reader/StreamErrors.h"
+#include "reader/UMIDChunk.h"
+
+namespace Orlo {
+
+namespace {
+const char* const kNoValue = "value does not exist";
+}  // namespace
+
+OrloStream::OrloStream(const char* path, unsigned int chunks) {
+    // One parser per type, made before the file opens. The iXML parser, when
+    // it comes, takes its place between bext and umid; until then its chunk is
+    // skipped like an unknown one.
+    m_ChunkTable[DS64_CHUNK] = std::make_shared<Chunks::DS64::DS64Chunk>();
+    m_ChunkTable[FMT_CHUNK] = std::make_shared<Chunks::FMT::FMTChunk>();
+    m_ChunkTable[DATA_CHUNK] = std::make_shared<Chunks::DATA::DATAChunk>(this);
+    m_ChunkTable[COMM_CHUNK] = std::make_shared<Chunks::COMM::COMMChunk>();
+    m_ChunkTable[SSND_CHUNK] = std::make_shared<Chunks::SSND::SSNDChunk>();
+    m_ChunkTable[BEXT_CHUNK] = std::make_shared<Chunks::BEXT::BEXTChunk>();
+    m_ChunkTable[UMID_CHUNK] = std::make_shared<Chunks::UMID::UMIDChunk>();
+
+    try {
+        m_FullFileName = path ? path : "";
+        m_File = path ? std::fopen(path, "rb") : nullptr;
+        if (!m_File) throw "File could not be opened";
+        m_FileSize = Chunks::CalcBytesRemaining(path, m_File);
+        ReadAndParseFile(chunks);
+        const uint16_t bits = GetBitsPerSample();
+        if (bits != 16 && bits != 24 && bits != 32) throw kUnsupportedBitsError;
+        if (GetIsDataFloatingPoint() && bits != 32)
+            throw "Only 32-bit is supported when sample format is floating point";
+        // No later stage can lay out frames of no channels.
+        if (GetChannelCount() == 0) throw kNoChannelsError;
+    } catch (const char* text) {
+        m_Error = text;
+    } catch (...) {
+        m_Error = "Unknown C++ exception";
+    }
+    if (m_File) std::fclose(m_File);
+    m_File = nullptr;
+}
+
+void OrloStream::ReadFourBytes(char* out, const char* message) { HelperFunctions::ReadBytes(out, 4, m_File, message); }
+
+void OrloStream::ReadAndParseFile(unsigned int chunks) {
+    if (chunks == 0) throw "No chunks specified for reading!";
+    char id[4];
+    ReadFourBytes(id, HelperFunctions::kShortReadMessage);
+    const bool little = HelperFunctions::IAmLittleEndian();
+    if (std::memcmp(id, "FORM", 4) == 0) {
+        m_FileWrongEndian = little;
+    } else if (std::memcmp(id, "RIFF", 4) == 0 || std::memcmp(id, "RF64", 4) == 0) {
+        m_FileWrongEndian = !little;
+        m_RF64 = std::memcmp(id, "RF64", 4) == 0;
+    } else {
+        throw "Input does not appear to be either AIFF or WAVE";
+    }
+
+    // The outer header's size is never used. In a file of under 8 bytes nothing
+    // is consumed here, and the form type is read from offset 0 again.
+    fseeko(m_File, 0, SEEK_SET);
+    Chunks::ChunkHeader_t outer;
+    ReadChunkHeader(&outer);
+    ReadFourBytes(id, HelperFunctions::kShortReadMessage);
+    if (std::memcmp(id, "AIFC", 4) != 0 && std::memcmp(id, "AIFF", 4) != 0 && std::memcmp(id, "WAVE", 4) != 0)
+        throw "Input is not a WAVE, AIFF, or AIFF-C file";
+
+    Chunks::ChunkHeader_t header;
+    for (;;) {
+        header.clear();
+        if (!ReadChunkHeader(&header)) break;
+        ReadAndInitChunk(header);
+    }
+}
+
+bool OrloStream::ReadChunkHeader(Chunks::ChunkHeader_t* header) {
+    const off_t position = ftello(m_File);
+    if (position < 0) return false;
+    // A trailing run of up to 7 bytes is no chunk: writers leave such tails.
+    if (position >= m_FileSize || m_FileSize - position < 8) return false;
+    char id[5] = {};
+    ReadFourBytes(id, "Expected chunk header");
+    char size[4];
+    ReadFourBytes(size, "Expected chunk header");
+    header->chunkId = id;
+    std::memcpy(&header->chunkSize, size, 4);
+    if (m_FileWrongEndian) HelperFunctions::SwapULong(header->chunkSize);
+    return true;
+}
+
+void OrloStream::ReadAndInitChunk(Chunks::ChunkHeader_t header) {
+    const off_t payload = ftello(m_File);
+    // Parsers see the padded size; 0xFFFFFFFF wraps to 0.
+    if (header.chunkSize & 1) header.chunkSize += 1;
+    const unsigned int type = ConvertStrToChunkType(header.chunkId);
+    const auto parser = m_ChunkTable.find(static_cast<SupportedChunks>(type));
+    if (parser == m_ChunkTable.end()) {
+        fseeko(m_File, header.chunkSize, SEEK_CUR);
+        return;
+    }
+    if (type == DATA_CHUNK && !HasChunk(FMT_CHUNK)) throw "Malformed WAVE file with 'DATA' before 'fmt '";
+    if (type == SSND_CHUNK && !HasChunk(COMM_CHUNK)) throw "Malformed AIFF file with 'SSND' before 'COMM'";
+    if (!parser->second->InitChunkFromStream(header, m_File, m_FileWrongEndian)) {
+        fseeko(m_File, payload + static_cast<off_t>(header.chunkSize), SEEK_SET);
+        return;
+    }
+    m_ChunksSeen |= type;
+    PerformAdditionalInitialization(*this, type);
+}
+
+template <typename First, typename Second, typename Value, typename Get>
+Value OrloStream::FromFirstAccepted(Get get) const {
+    if (HasChunk(ChunkKey<First>::value)) return get(*GetChunk<First>());
+    if (HasChunk(ChunkKey<Second>::value)) return get(*GetChunk<Second>());
+    throw std::logic_error(kNoValue);
+}
+
+using Chunks::COMM::COMMChunk;
+using Chunks::DATA::DATAChunk;
+using Chunks::FMT::FMTChunk;
+using Chunks::SSND::SSNDChunk;
+
+uint16_t OrloStream::GetChannelCount() const {
+    return FromFirstAccepted<FMTChunk, COMMChunk, uint16_t>([](const auto& c) { return c.GetChannelCount(); });
+}
+
+uint16_t OrloStream::GetBitsPerSample() const {
+    return FromFirstAccepted<FMTChunk, COMMChunk, uint16_t>([](const auto& c) { return c.GetBitsPerSample(); });
+}
+
+bool OrloStream::GetIsDataFloatingPoint() const {
+    return FromFirstAccepted<FMTChunk, COMMChunk, bool>([](const auto& c) { return c.IsFloatingPoint(); });
+}
+
+double OrloStream::GetSampleRate() const {
+    return FromFirstAccepted<FMTChunk, COMMChunk, double>([](const auto& c) { return c.GetSampleRate(); });
+}
+
+uint64_t OrloStream::GetSampleCount() const {
+    return FromFirstAccepted<DATAChunk, COMMChunk, uint64_t>([](const auto& c) { return c.GetSampleCount(); });
+}
+
+bool OrloStream::GetIsDataWrongEndian() const {
+    return FromFirstAccepted<DATAChunk, COMMChunk, bool>([](const auto& c) { return c.IsDataWrongEndian(); });
+}
+
+uint16_t OrloStream::GetSampleSize() const {
+    return FromFirstAccepted<DATAChunk, SSNDChunk, uint16_t>([](const auto& c) { return c.GetSampleSize(); });
+}
+
+int64_t OrloStream::GetStartPosition() const {
+    return FromFirstAccepted<DATAChunk, SSNDChunk, int64_t>([](const auto& c) { return c.GetMediaStartPos(); });
+}
+
+int64_t OrloStream::GetSamplePosition(unsigned long long sample) const {
+    return GetStartPosition() + static_cast<int64_t>(GetSampleSize() * sample * GetChannelCount());
+}
+
+int64_t OrloStream::GetBytesRemaining() const {
+    if (m_FileSize < 1) throw "Missing file-size attribute from file system.";
+    if (!m_File) return -1;
+    return m_FileSize - ftello(m_File);
+}
+
+}  // namespace Orlo

@@ -1,0 +1,22 @@
+#pragma once
+/// Reads one integer field of a chunk, swapped when the file's byte order is
+/// not the host's.
+#include <cstdio>
+
+#include "reader/ByteSwap.h"
+#include "reader/ReadBytes.h"
+
+namespace HelperFunctions {
+
+/// The short-read message of every fixed field of a chunk.
+inline constexpr char kShortReadMessage[] = "Some default error";
+
+template <typename T>
+T ReadValue(FILE* file, bool wrongEndian) {
+    T value;
+    ReadBytes(reinterpret_cast<char*>(&value), sizeof(T), file, kShortReadMessage);
+    if (wrongEndian) SwapBytes(value);
+    return value;
+}
+
+}  // namespace HelperFunctions

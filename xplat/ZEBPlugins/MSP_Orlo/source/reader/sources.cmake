@@ -1,0 +1,17 @@
+# The audio file reader: the chunk stream, its parsers and their file helpers.
+target_sources(OrloPlugin PRIVATE
+    ${CMAKE_CURRENT_LIST_DIR}/BEXTChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/COMMChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/CalcBytesRemaining.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/ConvertStrToChunkType.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/DATAChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/DS64Chunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/ExtendedFloat.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/FMTChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/OrloStream.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/ParseOriginationTime.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/PerformAdditionalInitialization.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/ReadBytes.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/SSNDChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/UMIDChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/int24.cpp)
