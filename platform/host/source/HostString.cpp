@@ -371,8 +371,8 @@ TOVRESULT HostString::FindText(const std::u32string& needle, int start, int* pos
 
 TOVRESULT HostString::FindTextReverse(const std::u32string& needle, int start, int* position) const {
     if (!position) return TOV_E_INVALIDARG;
-    const bool fromEnd = start < 0 || static_cast<size_t>(start) >= m_Text.size();
-    const size_t found = CodePoints().rfind(needle, fromEnd ? std::u32string::npos : static_cast<size_t>(start));
+    // A start at or past the end already searches from the end.
+    const size_t found = CodePoints().rfind(needle, start < 0 ? std::u32string::npos : static_cast<size_t>(start));
     *position = found == std::u32string::npos ? -1 : static_cast<int>(found);
     return TOV_OK;
 }

@@ -201,18 +201,25 @@ TEST_F(HostStringTest, RefusesMalformedInputAndKeepsTheText) {
 }
 
 TEST_F(HostStringTest, ViewsStayPutUntilTheTextChanges) {
-    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF16, kMixed);
+    // Long enough to live on the heap in every form.
+    const std::u32string text = kMixed + kMixed + kMixed + kMixed;
+    const std::string utf8Text = UnicodeCodec::EncodeUTF8(text);
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF16, text);
     const unsigned char* utf8 = nullptr;
-    const unsigned int* utf32 = nullptr;
+    const unsigned short* utf16 = nullptr;
     ASSERT_EQ(s->GetUTF8String(&utf8), TOV_OK);
-    ASSERT_EQ(s->GetUTF32String(&utf32), TOV_OK);
+    ASSERT_EQ(s->GetUTF16String(&utf16), TOV_OK);
     const unsigned char* utf8Again = nullptr;
+    const unsigned short* utf16Again = nullptr;
     ASSERT_EQ(s->GetUTF8String(&utf8Again), TOV_OK);
+    ASSERT_EQ(s->GetUTF16String(&utf16Again), TOV_OK);
     EXPECT_EQ(utf8Again, utf8);
-    EXPECT_STREQ(reinterpret_cast<const char*>(utf8), kMixedUTF8);  // both views readable at once
-    EXPECT_EQ(utf32[3], 0x1F600u);
+    EXPECT_EQ(utf16Again, utf16);
+    EXPECT_EQ(reinterpret_cast<const char*>(utf8), utf8Text);
+    EXPECT_EQ(utf16[3], 0xD83D);
+    EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF16);
     EXPECT_EQ(s->Append(L"!", 1), TOV_OK);
-    EXPECT_EQ(UTF8Of(s.Get()), std::string(kMixedUTF8) + "!");
+    EXPECT_EQ(UTF8Of(s.Get()), utf8Text + "!");
 }
 
 TEST_F(HostStringTest, WideStorageCanBeRewrittenInPlace) {

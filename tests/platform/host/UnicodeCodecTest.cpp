@@ -92,7 +92,8 @@ TEST(UnicodeCodecTest, RefusesMalformedUTF8AndKeepsTheOutput) {
 
 TEST(UnicodeCodecTest, RefusesUnpairedSurrogatesAndValuesOutOfRange) {
     const std::vector<unsigned short> utf16[] = {
-        {0xD800}, {0xDC00}, {0x41, 0xD83D}, {0xD83D, 0x41}, {0xDE00, 0xD83D}, {0xD800, 0xD800, 0xDC00},
+        {0xD800},       {0xDC00},         {0xDC00, 0xDC00},         {0x41, 0xD83D},
+        {0xD83D, 0x41}, {0xDE00, 0xD83D}, {0xD800, 0xD800, 0xDC00},
     };
     for (const auto& units : utf16) {
         SCOPED_TRACE(testing::PrintToString(units));
