@@ -108,9 +108,10 @@ ZEBString GetSubString(const ZEBString& s, unsigned int start, int count) {
     const uint32_t size = s.GetNumCharacters();
     // Measured in 64 bits, so a large count cannot wrap around below the size.
     const bool toEnd = count < 0 || static_cast<uint64_t>(count) + start > size;
-    // A start past the end makes the unsigned difference wrap to a negative length.
+    // A start past the end makes the unsigned difference wrap to a negative
+    // length; one far past it can wrap to a positive one, hence the test of start.
     const int length = toEnd ? static_cast<int>(size - start) : count;
-    if (length <= 0) return Empty();
+    if (length <= 0 || start >= size) return Empty();
     return FromWide(WideText(s).substr(start, static_cast<std::size_t>(length)));
 }
 
