@@ -3,6 +3,7 @@
 #include <memory>
 #include <vector>
 
+#include "ChunksCommand.h"
 #include "OrloOptions.h"
 #include "OrloVersion.h"
 #include "VersionCommand.h"
@@ -25,6 +26,7 @@ int main(int argc, char** argv) {
     // Each command in a file of its own; the first is what runs with no command.
     std::vector<std::unique_ptr<OrloCommand>> commands;
     commands.push_back(std::make_unique<VersionCommand>());
+    commands.push_back(std::make_unique<ChunksCommand>());
     std::vector<CLI::App*> declared;
     for (auto& command : commands) declared.push_back(command->Declare(app));
 

@@ -1,0 +1,155 @@
+#include "ChunksCommand.h"
+
+#include <algorithm>
+#include <cstdio>
+#include <nlohmann/json.hpp>
+#include <stdexcept>
+
+#include "OrloSession.h"
+#include "reader/BEXTChunk.h"
+#include "reader/ChunkIds.h"
+#include "reader/OrloStream.h"
+#include "reader/UMIDChunk.h"
+
+namespace {
+
+using Json = nlohmann::ordered_json;
+using Orlo::OrloStream;
+
+std::string Hex(const unsigned char* bytes, size_t count) {
+    static const char digits[] = "0123456789abcdef";
+    std::string out;
+    for (size_t i = 0; i < count; ++i) {
+        out += digits[bytes[i] >> 4];
+        out += digits[bytes[i] & 0x0F];
+    }
+    return out;
+}
+
+// The fixed-size text fields of bext are filled with zero bytes.
+std::string UpToZero(const std::string& text) { return text.substr(0, text.find('\0')); }
+
+// An accessor's value, or null when the stream has no chunk to answer from.
+template <typename Get>
+Json ValueOr(Get get) {
+    try {
+        return Json(get());
+    } catch (const std::exception&) {
+        return nullptr;
+    }
+}
+
+Json Chunks(const OrloStream& stream) {
+    static const struct {
+        unsigned int bit;
+        const char* id;
+    } kTable[] = {
+        {OrloStream::DS64_CHUNK, Chunks::DS64::ChunkId},     {OrloStream::FMT_CHUNK, Chunks::FMT::FMTChunkId},
+        {OrloStream::DATA_CHUNK, Chunks::DATA::DATAChunkId}, {OrloStream::BEXT_CHUNK, Chunks::BEXT::BEXTChunkId},
+        {OrloStream::IXML_CHUNK, Chunks::IXML::IXMLChunkId}, {OrloStream::UMID_CHUNK, Chunks::UMID::UMIDChunkId},
+        {OrloStream::COMM_CHUNK, Chunks::COMM::COMMChunkId}, {OrloStream::SSND_CHUNK, Chunks::SSND::SSNDChunkId}};
+    Json ids = Json::array();
+    for (const auto& row : kTable)
+        if (stream.HasChunk(row.bit)) ids.push_back(row.id);
+    return ids;
+}
+
+Json Bext(const Chunks::BEXT::BEXTChunk& bext) {
+    Json out = {{"description", UpToZero(bext.GetDescription())},
+                {"originator", UpToZero(bext.GetOriginator())},
+                {"originatorReference", UpToZero(bext.GetOriginatorReference())},
+                {"originationDate", UpToZero(bext.GetOriginationDate())},
+                {"originationTime", UpToZero(bext.GetOriginationTime())},
+                {"timeReference", bext.GetTimeReference()},
+                {"version", bext.GetVersion()},
+                {"umid", Hex(bext.GetUMID(), 64)},
+                {"keywords", Json(bext.GetConstParsedDescriptionField())},
+                {"codingHistory", UpToZero(bext.GetCodingHistory())}};
+    if (bext.GetVersion() == 2) {
+        const auto& loudness = bext.GetLoudness();
+        out["loudness"] = {{"loudnessValue", loudness.loudnessValue},
+                           {"loudnessRange", loudness.loudnessRange},
+                           {"maxTruePeakLevel", loudness.maxTruePeakLevel},
+                           {"maxMomentaryLoudness", loudness.maxMomentaryLoudness},
+                           {"maxShortTermLoudness", loudness.maxShortTermLoudness}};
+    }
+    return out;
+}
+
+Json Report(const std::string& path, const OrloStream& stream) {
+    const char* error = stream.GetError();
+    Json out = {{"file", path},
+                {"error", error ? Json(error) : Json(nullptr)},
+                {"wrongEndian", stream.IsFileWrongEndian()},
+                {"rf64", stream.IsRF64()},
+                {"chunks", Chunks(stream)},
+                {"channels", ValueOr([&] { return stream.GetChannelCount(); })},
+                {"sampleRate", ValueOr([&] { return stream.GetSampleRate(); })},
+                {"bitsPerSample", ValueOr([&] { return stream.GetBitsPerSample(); })},
+                {"floatingPoint", ValueOr([&] { return stream.GetIsDataFloatingPoint(); })},
+                {"sampleCount", ValueOr([&] { return stream.GetSampleCount(); })},
+                {"sampleSize", ValueOr([&] { return stream.GetSampleSize(); })},
+                {"startPosition", ValueOr([&] { return stream.GetStartPosition(); })},
+                {"dataWrongEndian", ValueOr([&] { return stream.GetIsDataWrongEndian(); })}};
+    if (stream.HasChunk(OrloStream::BEXT_CHUNK)) out["bext"] = Bext(*stream.GetChunk<Chunks::BEXT::BEXTChunk>());
+    if (stream.HasChunk(OrloStream::UMID_CHUNK)) {
+        const auto umid = stream.GetChunk<Chunks::UMID::UMIDChunk>();
+        out["umid"] = {{"hex", Hex(umid->GetUMID(), 24)}, {"valid", umid->IsValid()}};
+    }
+    return out;
+}
+
+// Recorders put any bytes into text fields: never fail on them.
+std::string Dump(const Json& value, int indent = -1) {
+    return value.dump(indent, ' ', false, Json::error_handler_t::replace);
+}
+
+// "key: value" lines, nested objects indented; texts with line breaks or other
+// control characters, and lists, are shown as JSON.
+void PrintText(const Json& object, int depth) {
+    for (const auto& [key, value] : object.items()) {
+        const std::string margin(depth * 2, ' ');
+        if (value.is_object()) {
+            std::printf("%s%s:\n", margin.c_str(), key.c_str());
+            PrintText(value, depth + 1);
+            continue;
+        }
+        std::string shown;
+        if (value.is_null()) {
+            shown = "-";
+        } else if (value.is_string()) {
+            const std::string& text = value.get_ref<const std::string&>();
+            const bool plain = std::none_of(text.begin(), text.end(), [](char c) { return c >= 0 && c < 0x20; });
+            shown = plain ? text : Dump(value);
+        } else {
+            shown = Dump(value);
+        }
+        std::printf("%s%s: %s\n", margin.c_str(), key.c_str(), shown.c_str());
+    }
+}
+
+}  // namespace
+
+CLI::App* ChunksCommand::Declare(CLI::App& app) {
+    CLI::App* command = app.add_subcommand("chunks", "show what the chunk stream makes of an audio file, and why");
+    command->add_option("FILE", m_Path, "a WAV, Broadcast Wave, RF64, AIFF or AIFF-C file")->required();
+    command->add_flag("--json", m_Json, "one JSON object instead of text");
+    return command;
+}
+
+int ChunksCommand::Run(const OrloOptions& options) {
+    OrloSession session(options.Verbosity(), false);
+    if (session.StartResult() < 0) {
+        std::fprintf(stderr, "orlo: the host's services did not start (0x%08X)\n",
+                     static_cast<unsigned>(session.StartResult()));
+        return kExitFailed;
+    }
+    const OrloStream stream(m_Path.c_str(), 255);
+    const Json report = Report(m_Path, stream);
+    if (m_Json) {
+        std::printf("%s\n", Dump(report, 2).c_str());
+    } else {
+        PrintText(report, 0);
+    }
+    return stream.GetError() ? kExitFailed : kExitOK;
+}
