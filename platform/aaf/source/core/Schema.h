@@ -1,0 +1,77 @@
+#pragma once
+/// The definitions of one file: classes, properties, types and data
+/// definitions, built-in and registered at run time. The schema owns every
+/// definition; a reference to any definition, and every object of the file,
+/// holds a reference to the schema, so definitions stay valid while anything
+/// of the file is alive.
+#include <memory>
+#include <unordered_map>
+#include <vector>
+
+#include "BuiltinDefinitions.h"
+#include "UIDHash.h"
+#include "aaf/AAFTypes.h"
+
+namespace aafmodel {
+
+class ClassDefinition;
+class DataDefinition;
+class PropertyDefinition;
+class TypeDefinition;
+
+class Schema {
+public:
+    /// A schema with the built-in definitions, and one reference for the caller.
+    static Schema* Create();
+
+    aafUInt32 AddRef() { return ++m_refs; }
+    aafUInt32 Release();
+
+    /// Takes ownership of a definition; it is not yet registered.
+    ClassDefinition* Own(std::unique_ptr<ClassDefinition> def);
+    TypeDefinition* Own(std::unique_ptr<TypeDefinition> def);
+    DataDefinition* Own(std::unique_ptr<DataDefinition> def);
+    PropertyDefinition* Own(std::unique_ptr<PropertyDefinition> def);
+
+    /// Makes a definition findable by its id; throws AAFRESULT_TABLE_DUP_KEY
+    /// when the id is taken, AAFRESULT_NOT_INITIALIZED for an undefined one.
+    void Register(ClassDefinition& def);
+    void Register(TypeDefinition& def);
+    void Register(DataDefinition& def);
+
+    ClassDefinition* FindClass(const aafUID_t& id) const;
+    TypeDefinition* FindType(const aafUID_t& id) const;
+    DataDefinition* FindDataDef(const aafUID_t& id) const;
+
+    const std::vector<ClassDefinition*>& Classes() const { return m_classOrder; }
+    const std::vector<TypeDefinition*>& Types() const { return m_typeOrder; }
+    const std::vector<DataDefinition*>& DataDefs() const { return m_dataDefOrder; }
+
+    /// The built-in definitions, for the views' direct use.
+    const BuiltinDefinitions& B() const { return m_builtins; }
+    BuiltinDefinitions& MutableBuiltins() { return m_builtins; }
+
+    /// Numbers property definitions in the order they were made, which is the
+    /// order in which an object lists its properties.
+    aafUInt32 NextPropertySerial() { return m_nextSerial++; }
+
+private:
+    Schema();
+    ~Schema();
+
+    aafUInt32 m_refs = 0;
+    aafUInt32 m_nextSerial = 0;
+    std::vector<std::unique_ptr<ClassDefinition>> m_classes;
+    std::vector<std::unique_ptr<TypeDefinition>> m_types;
+    std::vector<std::unique_ptr<DataDefinition>> m_dataDefs;
+    std::vector<std::unique_ptr<PropertyDefinition>> m_properties;
+    std::unordered_map<aafUID_t, ClassDefinition*, UIDHash> m_classById;
+    std::unordered_map<aafUID_t, TypeDefinition*, UIDHash> m_typeById;
+    std::unordered_map<aafUID_t, DataDefinition*, UIDHash> m_dataDefById;
+    std::vector<ClassDefinition*> m_classOrder;
+    std::vector<TypeDefinition*> m_typeOrder;
+    std::vector<DataDefinition*> m_dataDefOrder;
+    BuiltinDefinitions m_builtins;
+};
+
+}  // namespace aafmodel

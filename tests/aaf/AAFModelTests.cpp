@@ -1,0 +1,281 @@
+// The object model's published behaviours and its answers to misuse, through
+// the library's own entry point.
+#include <gtest/gtest.h>
+
+#include <string>
+#include <vector>
+
+#include "AAFTestFile.h"
+
+using namespace aaftest;
+
+namespace {
+
+aafMobID_t MobID(aafUInt8 last) {
+    aafMobID_t id{{0x06, 0x0A, 0x2B, 0x34, 1, 1, 1, 5, 1, 1, 0x0F, 0x20}, 0x13, 0, 0, 0, {}};
+    id.material.Data4[7] = last;
+    return id;
+}
+
+class AAFModel : public ::testing::Test {
+protected:
+    TransientFile f{&AAFFileOpenTransient};
+
+    Ptr<IAAFMob> NewMasterMob(aafUInt8 idByte) {
+        auto mob = f.Create<IAAFMob>(kAAFClassID_MasterMob);
+        Query<IAAFMasterMob>(mob.get())->Initialize();
+        mob->SetMobID(MobID(idByte));
+        return mob;
+    }
+};
+
+TEST_F(AAFModel, TransientFileHasHeaderDictionaryAndIdentification) {
+    ASSERT_TRUE(f.file && f.header && f.dictionary);
+    aafUInt32 count = 0;
+    EXPECT_EQ(f.header->CountIdentifications(&count), AAFRESULT_SUCCESS);
+    EXPECT_EQ(count, 1u);
+    Ptr<IAAFIdentification> ident;
+    ASSERT_EQ(f.header->GetLastIdentification(ident.out()), AAFRESULT_SUCCESS);
+    aafCharacter name[64];
+    ASSERT_EQ(ident->GetProductName(name, sizeof name), AAFRESULT_SUCCESS);
+    EXPECT_EQ(std::wstring(name), L"Test Product");
+    aafNumSlots_t mobs = 99;
+    EXPECT_EQ(f.header->CountMobs(kAAFAllMob, &mobs), AAFRESULT_SUCCESS);
+    EXPECT_EQ(mobs, 0u);
+}
+
+TEST_F(AAFModel, InitializeTwiceFails) {
+    auto master = f.Create<IAAFMasterMob>(kAAFClassID_MasterMob);
+    auto source = f.Create<IAAFSourceMob>(kAAFClassID_SourceMob);
+    auto sequence = f.Create<IAAFSequence>(kAAFClassID_Sequence);
+    auto pcm = f.Create<IAAFPCMDescriptor>(kAAFClassID_PCMDescriptor);
+    auto sound = f.DataDef(kAAFDataDef_Sound);
+    EXPECT_EQ(master->Initialize(), AAFRESULT_SUCCESS);
+    EXPECT_EQ(master->Initialize(), AAFRESULT_ALREADY_INITIALIZED);
+    EXPECT_EQ(source->Initialize(), AAFRESULT_SUCCESS);
+    EXPECT_EQ(source->Initialize(), AAFRESULT_ALREADY_INITIALIZED);
+    EXPECT_EQ(sequence->Initialize(sound.get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(sequence->Initialize(sound.get()), AAFRESULT_ALREADY_INITIALIZED);
+    EXPECT_EQ(pcm->Initialize(), AAFRESULT_SUCCESS);
+    EXPECT_EQ(pcm->Initialize(), AAFRESULT_ALREADY_INITIALIZED);
+}
+
+TEST_F(AAFModel, AddMobRefusesDuplicateIdAndSecondPlacement) {
+    auto a = NewMasterMob(1);
+    auto b = NewMasterMob(1);
+    auto c = NewMasterMob(2);
+    EXPECT_EQ(f.header->AddMob(a.get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(f.header->AddMob(b.get()), AAFRESULT_DUPLICATE_MOBID);
+    EXPECT_EQ(f.header->AddMob(c.get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(f.header->AddMob(c.get()), AAFRESULT_DUPLICATE_MOBID);
+    Ptr<IAAFMob> found;
+    EXPECT_EQ(f.header->LookupMob(MobID(2), found.out()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(f.header->LookupMob(MobID(3), found.out()), AAFRESULT_MOB_NOT_FOUND);
+    auto uninitialised = f.Create<IAAFMob>(kAAFClassID_SourceMob);
+    EXPECT_EQ(f.header->AddMob(uninitialised.get()), AAFRESULT_NOT_INITIALIZED);
+}
+
+TEST_F(AAFModel, NullArgumentsGiveNullParam) {
+    auto mob = NewMasterMob(1);
+    auto sound = f.DataDef(kAAFDataDef_Sound);
+    Ptr<IAAFMobSlot> slot;
+    const std::vector<std::pair<const char*, AAFRESULT>> cases = {
+        {"AAFFileOpenTransient ident", AAFFileOpenTransient(nullptr, nullptr)},
+        {"GetHeader", f.file->GetHeader(nullptr)},
+        {"AddMob", f.header->AddMob(nullptr)},
+        {"LookupClassDef", f.dictionary->LookupClassDef(kAAFClassID_MasterMob, nullptr)},
+        {"SetName", mob->SetName(nullptr)},
+        {"GetMobID", mob->GetMobID(nullptr)},
+        {"LookupSlot", mob->LookupSlot(1, nullptr)},
+        {"AppendComment", mob->AppendComment(nullptr, L"x")},
+        {"AppendNewTimelineSlot", mob->AppendNewTimelineSlot({1, 1}, nullptr, 1, L"a", 0, nullptr)},
+        {"NewPhysSourceRef", Query<IAAFMasterMob>(mob.get())->NewPhysSourceRef({1, 1}, 1, nullptr, {}, 1)},
+        {"Sequence Initialize", f.Create<IAAFSequence>(kAAFClassID_Sequence)->Initialize(nullptr)},
+    };
+    for (const auto& c : cases) EXPECT_EQ(c.second, AAFRESULT_NULL_PARAM) << c.first;
+}
+
+TEST_F(AAFModel, LookupsOfUnknownIdsFail) {
+    auto mob = NewMasterMob(1);
+    Ptr<IAAFMobSlot> slot;
+    EXPECT_EQ(mob->LookupSlot(7, slot.out()), AAFRESULT_SLOT_NOT_FOUND);
+    Ptr<IAAFClassDef> cls;
+    EXPECT_EQ(f.dictionary->LookupClassDef(kAAFPropID_Mob_Name, cls.out()), AAFRESULT_OBJECT_NOT_FOUND);
+    Ptr<IAAFTypeDef> type;
+    EXPECT_EQ(f.dictionary->LookupTypeDef(kAAFClassID_Mob, type.out()), AAFRESULT_OBJECT_NOT_FOUND);
+    Ptr<IAAFDataDef> def;
+    EXPECT_EQ(f.dictionary->LookupDataDef(kAAFClassID_Mob, def.out()), AAFRESULT_OBJECT_NOT_FOUND);
+    Ptr<IUnknown> abstract;
+    EXPECT_EQ(f.dictionary->CreateInstance(kAAFClassID_Mob, IID_IAAFMob, abstract.out()), AAFRESULT_INVALID_PARAM);
+}
+
+TEST_F(AAFModel, NewPhysSourceRefMakesTheMissingSlotAndReplacesAClip) {
+    auto mob = NewMasterMob(1);
+    auto master = Query<IAAFMasterMob>(mob.get());
+    auto sound = f.DataDef(kAAFDataDef_LegacySound);
+    aafSourceRef_t ref{MobID(9), 2, 100};
+    ASSERT_EQ(master->NewPhysSourceRef({48000, 1}, 3, sound.get(), ref, 480), AAFRESULT_SUCCESS);
+    ref.sourceSlotID = 4;
+    ASSERT_EQ(master->NewPhysSourceRef({48000, 1}, 3, sound.get(), ref, 960), AAFRESULT_SUCCESS);
+    aafNumSlots_t slots = 0;
+    mob->CountSlots(&slots);
+    EXPECT_EQ(slots, 1u);
+    Ptr<IAAFMobSlot> slot;
+    ASSERT_EQ(mob->LookupSlot(3, slot.out()), AAFRESULT_SUCCESS);
+    Ptr<IAAFSegment> segment;
+    ASSERT_EQ(slot->GetSegment(segment.out()), AAFRESULT_SUCCESS);
+    auto clip = Query<IAAFSourceClip>(segment.get());
+    ASSERT_TRUE(clip);
+    aafSourceRef_t got{};
+    ASSERT_EQ(clip->GetSourceReference(&got), AAFRESULT_SUCCESS);
+    EXPECT_EQ(got.sourceSlotID, 4u);
+    EXPECT_EQ(got.startTime, 100);
+    aafLength_t length = 0;
+    Query<IAAFComponent>(segment.get())->GetLength(&length);
+    EXPECT_EQ(length, 960);
+    // One object answers every interface of its class and its parents.
+    for (const aafUID_t* iid : {&IID_IAAFSourceReference, &IID_IAAFSourceReference2, &IID_IAAFSegment,
+                                &IID_IAAFComponent, &IID_IAAFComponent2, &IID_IAAFObject, &IID_IUnknown}) {
+        Ptr<IUnknown> face;
+        EXPECT_EQ(clip->QueryInterface(*iid, face.outVoid()), AAFRESULT_SUCCESS);
+    }
+    Ptr<IUnknown> none;
+    EXPECT_EQ(clip->QueryInterface(IID_IAAFSequence, none.outVoid()), AAF_E_NOINTERFACE);
+}
+
+TEST_F(AAFModel, CommentsAreTaggedValuesOfTheMob) {
+    auto mob = NewMasterMob(1);
+    ASSERT_EQ(mob->AppendComment(L"Scene", L"12A"), AAFRESULT_SUCCESS);
+    ASSERT_EQ(mob->AppendComment(L"Take", L""), AAFRESULT_SUCCESS);
+    aafUInt32 count = 0;
+    mob->CountComments(&count);
+    EXPECT_EQ(count, 2u);
+    Ptr<IEnumAAFTaggedValues> comments;
+    ASSERT_EQ(mob->GetComments(comments.out()), AAFRESULT_SUCCESS);
+    Ptr<IAAFTaggedValue> first;
+    ASSERT_EQ(comments->NextOne(first.out()), AAFRESULT_SUCCESS);
+    aafCharacter text[16];
+    aafUInt32 read = 0;
+    ASSERT_EQ(first->GetValue(sizeof text, reinterpret_cast<aafDataBuffer_t>(text), &read), AAFRESULT_SUCCESS);
+    EXPECT_EQ(std::wstring(text), L"12A");
+    EXPECT_EQ(read, 4 * sizeof(aafCharacter));
+    aafCharacter small[2];
+    EXPECT_EQ(first->GetName(small, sizeof small), AAFRESULT_SMALLBUF);
+    EXPECT_EQ(mob->RemoveComment(first.get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(mob->RemoveComment(first.get()), AAFRESULT_OBJECT_NOT_FOUND);
+}
+
+TEST_F(AAFModel, ASegmentSitsInOneSlotOnly) {
+    auto mob = NewMasterMob(1);
+    auto filler = f.Create<IAAFFiller>(kAAFClassID_Filler);
+    auto sound = f.DataDef(kAAFDataDef_Sound);
+    filler->Initialize(sound.get(), 10);
+    auto segment = Query<IAAFSegment>(filler.get());
+    EXPECT_EQ(mob->AppendNewTimelineSlot({25, 1}, segment.get(), 1, L"A1", 0, nullptr), AAFRESULT_SUCCESS);
+    EXPECT_EQ(mob->AppendNewTimelineSlot({25, 1}, segment.get(), 2, L"A2", 0, nullptr),
+              AAFRESULT_OBJECT_ALREADY_ATTACHED);
+}
+
+TEST_F(AAFModel, SequenceLengthFollowsItsComponentsAndRefusesOtherData) {
+    auto sequence = f.Create<IAAFSequence>(kAAFClassID_Sequence);
+    auto timecodeDef = f.DataDef(kAAFDataDef_Timecode);
+    auto sound = f.DataDef(kAAFDataDef_Sound);
+    sequence->Initialize(timecodeDef.get());
+    auto tc = f.Create<IAAFTimecode>(kAAFClassID_Timecode);
+    aafTimecode_t value{0, 1, 25};
+    ASSERT_EQ(tc->Initialize(100, &value), AAFRESULT_SUCCESS);
+    ASSERT_EQ(sequence->AppendComponent(Query<IAAFComponent>(tc.get()).get()), AAFRESULT_SUCCESS);
+    auto filler = f.Create<IAAFFiller>(kAAFClassID_Filler);
+    filler->Initialize(timecodeDef.get(), 20);
+    ASSERT_EQ(sequence->PrependComponent(Query<IAAFComponent>(filler.get()).get()), AAFRESULT_SUCCESS);
+    aafLength_t length = 0;
+    Query<IAAFComponent>(sequence.get())->GetLength(&length);
+    EXPECT_EQ(length, 120);
+    auto soundFiller = f.Create<IAAFFiller>(kAAFClassID_Filler);
+    soundFiller->Initialize(sound.get(), 1);
+    EXPECT_EQ(sequence->AppendComponent(Query<IAAFComponent>(soundFiller.get()).get()), AAFRESULT_INVALID_DATADEF);
+    Ptr<IAAFComponent> at;
+    EXPECT_EQ(sequence->GetComponentAt(2, at.out()), AAFRESULT_BADINDEX);
+}
+
+TEST_F(AAFModel, DynamicOptionalPropertyThroughTheGenericInterfaces) {
+    const aafUID_t propId = {0x11111111, 0x2222, 0x3333, {4, 4, 4, 4, 4, 4, 4, 4}};
+    Ptr<IAAFClassDef> cls;
+    ASSERT_EQ(f.dictionary->LookupClassDef(kAAFClassID_EssenceDescriptor, cls.out()), AAFRESULT_SUCCESS);
+    Ptr<IAAFTypeDef> type;
+    ASSERT_EQ(f.dictionary->LookupTypeDef(kAAFTypeID_UInt32, type.out()), AAFRESULT_SUCCESS);
+    Ptr<IAAFPropertyDef> prop;
+    ASSERT_EQ(cls->RegisterOptionalPropertyDef(propId, L"Extra", type.get(), prop.out()), AAFRESULT_SUCCESS);
+    Ptr<IAAFPropertyDef> again;
+    EXPECT_EQ(cls->RegisterOptionalPropertyDef(propId, L"Extra", type.get(), again.out()), AAFRESULT_TABLE_DUP_KEY);
+
+    auto pcm = f.Create<IAAFPCMDescriptor>(kAAFClassID_PCMDescriptor);
+    auto object = Query<IAAFObject>(pcm.get());
+    aafBool present = kAAFTrue;
+    ASSERT_EQ(object->IsPropertyPresent(prop.get(), &present), AAFRESULT_SUCCESS);
+    EXPECT_EQ(present, kAAFFalse);
+    aafUInt32 kind = 3;
+    Ptr<IAAFPropertyValue> value;
+    ASSERT_EQ(Query<IAAFTypeDefInt>(type.get())->CreateValue(reinterpret_cast<aafMemPtr_t>(&kind), 4, value.out()),
+              AAFRESULT_SUCCESS);
+    ASSERT_EQ(object->SetPropertyValue(prop.get(), value.get()), AAFRESULT_SUCCESS);
+    Ptr<IAAFPropertyValue> read;
+    ASSERT_EQ(object->GetPropertyValue(prop.get(), read.out()), AAFRESULT_SUCCESS);
+    aafUInt32 got = 0;
+    EXPECT_EQ(Query<IAAFTypeDefInt>(type.get())->GetInteger(read.get(), reinterpret_cast<aafMemPtr_t>(&got), 4),
+              AAFRESULT_SUCCESS);
+    EXPECT_EQ(got, 3u);
+    aafUInt16 narrow = 0;
+    EXPECT_EQ(Query<IAAFTypeDefInt>(type.get())->GetInteger(read.get(), reinterpret_cast<aafMemPtr_t>(&narrow), 2),
+              AAFRESULT_ILLEGAL_VALUE);
+
+    // A property of another class is not this object's.
+    Ptr<IAAFClassDef> mobClass;
+    f.dictionary->LookupClassDef(kAAFClassID_Mob, mobClass.out());
+    Ptr<IAAFPropertyDef> mobName;
+    mobClass->LookupPropertyDef(kAAFPropID_Mob_Name, mobName.out());
+    EXPECT_EQ(object->IsPropertyPresent(mobName.get(), &present), AAFRESULT_PROPERTY_NOT_FOUND);
+}
+
+TEST_F(AAFModel, AttributesAppendThroughAnOptionalStrongReferenceVector) {
+    auto mob = NewMasterMob(1);
+    auto tagged = f.Create<IAAFTaggedValue>(kAAFClassID_TaggedValue);
+    Ptr<IAAFTypeDef> bytes;
+    f.dictionary->LookupTypeDef(kAAFTypeID_UInt8Array, bytes.out());
+    aafUInt8 data[3] = {1, 2, 3};
+    ASSERT_EQ(tagged->Initialize(L"HeadFrame", bytes.get(), sizeof data, data), AAFRESULT_SUCCESS);
+    Ptr<IAAFTypeDef> refType, vectorType;
+    f.dictionary->LookupTypeDef(kAAFTypeID_TaggedValueStrongReference, refType.out());
+    f.dictionary->LookupTypeDef(kAAFTypeID_TaggedValueStrongReferenceVector, vectorType.out());
+    Ptr<IAAFPropertyValue> element;
+    ASSERT_EQ(Query<IAAFTypeDefObjectRef>(refType.get())->CreateValue(tagged.get(), element.out()),
+              AAFRESULT_SUCCESS);
+    Ptr<IAAFClassDef> mobClass;
+    f.dictionary->LookupClassDef(kAAFClassID_Mob, mobClass.out());
+    Ptr<IAAFPropertyDef> attributes;
+    mobClass->LookupPropertyDef(kAAFPropID_Mob_Attributes, attributes.out());
+    auto object = Query<IAAFObject>(mob.get());
+    Ptr<IAAFPropertyValue> list;
+    ASSERT_EQ(object->CreateOptionalPropertyValue(attributes.get(), list.out()), AAFRESULT_SUCCESS);
+    ASSERT_EQ(Query<IAAFTypeDefVariableArray>(vectorType.get())->AppendElement(list.get(), element.get()),
+              AAFRESULT_SUCCESS);
+    aafUInt32 count = 0;
+    Query<IAAFMob2>(mob.get())->CountAttributes(&count);
+    EXPECT_EQ(count, 1u);
+}
+
+TEST(AAFLibrary, ResultTextsAndVersion) {
+    aafProductVersion_t version{};
+    EXPECT_EQ(AAFGetLibraryVersion(&version), AAFRESULT_SUCCESS);
+    EXPECT_EQ(AAFGetLibraryVersion(nullptr), AAFRESULT_NULL_PARAM);
+    aafUInt32 size = 0;
+    ASSERT_EQ(AAFResultToTextBufLen(AAFRESULT_DUPLICATE_MOBID, &size), AAFRESULT_SUCCESS);
+    std::vector<aafCharacter> text(size / sizeof(aafCharacter));
+    ASSERT_EQ(AAFResultToText(AAFRESULT_DUPLICATE_MOBID, text.data(), size), AAFRESULT_SUCCESS);
+    EXPECT_EQ(std::wstring(text.data()), L"AAFRESULT_DUPLICATE_MOBID");
+    EXPECT_EQ(AAFResultToText(AAFRESULT_DUPLICATE_MOBID, text.data(), size - 1), AAFRESULT_SMALLBUF);
+    IAAFFile* file = nullptr;
+    EXPECT_EQ(AAFFileOpenExistingRead(L"x.aaf", 0, &file), AAFRESULT_NOT_IMPLEMENTED);
+}
+
+}  // namespace
