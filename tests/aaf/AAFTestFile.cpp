@@ -14,8 +14,9 @@ aafProductIdentification_t* TestIdentification() {
     return &ident;
 }
 
-TransientFile::TransientFile(AAFRESULT (*open)(aafProductIdentification_t*, IAAFFile**)) {
-    if (AAFRESULT_FAILED(open(TestIdentification(), file.out()))) return;
+TransientFile::TransientFile(AAFRESULT (*open)(aafProductIdentification_t*, IAAFFile**),
+                             aafProductIdentification_t* ident) {
+    if (AAFRESULT_FAILED(open(ident, file.out()))) return;
     file->GetHeader(header.out());
     header->GetDictionary(dictionary.out());
 }

@@ -14,6 +14,10 @@ public:
     Ptr(const Ptr&) = delete;
     Ptr& operator=(const Ptr&) = delete;
     Ptr(Ptr&& o) noexcept : m_p(std::exchange(o.m_p, nullptr)) {}
+    Ptr& operator=(Ptr&& o) noexcept {
+        std::swap(m_p, o.m_p);
+        return *this;
+    }
     ~Ptr() {
         if (m_p) m_p->Release();
     }
@@ -42,7 +46,8 @@ aafProductIdentification_t* TestIdentification();
 /// Opens a transient file through `open` (the library's entry point or the
 /// loader's forwarder) and keeps its header and dictionary.
 struct TransientFile {
-    explicit TransientFile(AAFRESULT (*open)(aafProductIdentification_t*, IAAFFile**));
+    explicit TransientFile(AAFRESULT (*open)(aafProductIdentification_t*, IAAFFile**),
+                           aafProductIdentification_t* ident = TestIdentification());
     Ptr<IAAFFile> file;
     Ptr<IAAFHeader> header;
     Ptr<IAAFDictionary> dictionary;

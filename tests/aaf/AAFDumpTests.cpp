@@ -1,0 +1,88 @@
+// The worked examples of the clip builder, built through the loader and
+// dumped, compared with the golden files; and what the dump shows of clocks
+// and dynamic properties. ORLO_UPDATE_GOLDEN=1 rewrites the golden files.
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <fstream>
+#include <sstream>
+#include <string>
+
+#include "AAFTestFile.h"
+#include "ExampleClips.h"
+#include "aaf/dumpAAF.h"
+
+using namespace aaftest;
+
+namespace {
+
+std::string Dump(IAAFFile* file, ZEB::AAFDumpOptions options) {
+    std::ostringstream out;
+    EXPECT_EQ(ZEB::dumpAAF(file, out, options), AAFRESULT_SUCCESS);
+    return out.str();
+}
+
+void CompareWithGolden(const std::string& dump, const std::string& name) {
+    const std::string path = std::string(AAF_GOLDEN_DIR) + "/" + name;
+    if (std::getenv("ORLO_UPDATE_GOLDEN")) std::ofstream(path) << dump;
+    std::ifstream in(path);
+    ASSERT_TRUE(in) << "missing golden file " << path;
+    std::stringstream golden;
+    golden << in.rdbuf();
+    EXPECT_EQ(dump, golden.str()) << "dump differs from " << path;
+}
+
+struct GoldenCase {
+    const char* name;
+    IAAFFile* (*build)();
+    ZEB::AAFDumpOptions::Format format;
+    const char* golden;
+};
+
+IAAFFile* Grouped125() { return BuildGroupedClip({1, 2, 5}); }
+
+class AAFDumpGolden : public ::testing::TestWithParam<GoldenCase> {};
+
+TEST_P(AAFDumpGolden, MatchesTheGoldenFile) {
+    const GoldenCase& c = GetParam();
+    Ptr<IAAFFile> file;
+    ASSERT_NO_THROW(*file.out() = c.build());
+    ZEB::AAFDumpOptions options;
+    options.format = c.format;
+    options.omitClock = true;
+    CompareWithGolden(Dump(file.get(), options), c.golden);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Examples, AAFDumpGolden,
+    ::testing::Values(GoldenCase{"StereoText", &BuildStereoClip, ZEB::AAFDumpOptions::Format::Text, "stereo_clip.txt"},
+                      GoldenCase{"StereoJSON", &BuildStereoClip, ZEB::AAFDumpOptions::Format::JSON, "stereo_clip.json"},
+                      GoldenCase{"GroupedText", &Grouped125, ZEB::AAFDumpOptions::Format::Text, "grouped_clip.txt"}),
+    [](const auto& info) { return std::string(info.param.name); });
+
+TEST(AAFDump, ClockValuesAppearUnlessOmitted) {
+    Ptr<IAAFFile> file;
+    *file.out() = BuildStereoClip();
+    ZEB::AAFDumpOptions options;
+    EXPECT_NE(Dump(file.get(), options).find("CreationTime"), std::string::npos);
+    options.omitClock = true;
+    const std::string dump = Dump(file.get(), options);
+    for (const char* clock : {"CreationTime", "LastModified", "Date:"})
+        EXPECT_EQ(dump.find(clock), std::string::npos) << clock;
+}
+
+TEST(AAFDump, DynamicPropertiesAppearByName) {
+    Ptr<IAAFFile> file;
+    *file.out() = BuildStereoClip();
+    const std::string dump = Dump(file.get(), {});
+    EXPECT_NE(dump.find("MediaContainerGUID: \"{3711D3CC-62D0-49D7-B0AE-C118101D1A16}\""), std::string::npos);
+    EXPECT_NE(dump.find("MediaAccessKind: 3"), std::string::npos);
+}
+
+TEST(AAFDump, NullArguments) {
+    std::ostringstream out;
+    EXPECT_EQ(ZEB::dumpAAF(static_cast<IAAFFile*>(nullptr), out), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(ZEB::dumpAAF(static_cast<IAAFObject*>(nullptr), out), AAFRESULT_NULL_PARAM);
+}
+
+}  // namespace
