@@ -5,9 +5,11 @@
 #include <nlohmann/json.hpp>
 #include <stdexcept>
 
+#include "IxmlReport.h"
 #include "OrloSession.h"
 #include "reader/BEXTChunk.h"
 #include "reader/ChunkIds.h"
+#include "reader/IXMLChunk.h"
 #include "reader/OrloStream.h"
 #include "reader/UMIDChunk.h"
 
@@ -76,7 +78,7 @@ Json Bext(const Chunks::BEXT::BEXTChunk& bext) {
     return out;
 }
 
-Json Report(const std::string& path, const OrloStream& stream) {
+Json Report(const std::string& path, const OrloStream& stream, ITOVComponentFactory* factory) {
     const char* error = stream.GetError();
     Json out = {{"file", path},
                 {"error", error ? Json(error) : Json(nullptr)},
@@ -92,6 +94,8 @@ Json Report(const std::string& path, const OrloStream& stream) {
                 {"startPosition", ValueOr([&] { return stream.GetStartPosition(); })},
                 {"dataWrongEndian", ValueOr([&] { return stream.GetIsDataWrongEndian(); })}};
     if (stream.HasChunk(OrloStream::BEXT_CHUNK)) out["bext"] = Bext(*stream.GetChunk<Chunks::BEXT::BEXTChunk>());
+    if (stream.HasChunk(OrloStream::IXML_CHUNK))
+        out["ixml"] = IxmlReport(stream.GetChunk<Chunks::IXML::IXMLChunk>()->GetRawXml(), factory);
     if (stream.HasChunk(OrloStream::UMID_CHUNK)) {
         const auto umid = stream.GetChunk<Chunks::UMID::UMIDChunk>();
         out["umid"] = {{"hex", Hex(umid->GetUMID(), 24)}, {"valid", umid->IsValid()}};
@@ -145,7 +149,7 @@ int ChunksCommand::Run(const OrloOptions& options) {
         return kExitFailed;
     }
     const OrloStream stream(m_Path.c_str(), 255);
-    const Json report = Report(m_Path, stream);
+    const Json report = Report(m_Path, stream, &session.Host());
     if (m_Json) {
         std::printf("%s\n", Dump(report, 2).c_str());
     } else {

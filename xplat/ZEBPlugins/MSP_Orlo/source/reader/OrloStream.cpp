@@ -10,6 +10,7 @@
 #include "reader/DATAChunk.h"
 #include "reader/DS64Chunk.h"
 #include "reader/FMTChunk.h"
+#include "reader/IXMLChunk.h"
 #include "reader/PerformAdditionalInitialization.h"
 #include "reader/ReadBytes.h"
 #include "reader/ReadValue.h"
@@ -24,15 +25,14 @@ const char* const kNoValue = "value does not exist";
 }  // namespace
 
 OrloStream::OrloStream(const char* path, unsigned int chunks) {
-    // One parser per type, made before the file opens. The iXML parser, when
-    // it comes, takes its place between bext and umid; until then its chunk is
-    // skipped like an unknown one.
+    // One parser per type, made before the file opens.
     m_ChunkTable[DS64_CHUNK] = std::make_shared<Chunks::DS64::DS64Chunk>();
     m_ChunkTable[FMT_CHUNK] = std::make_shared<Chunks::FMT::FMTChunk>();
     m_ChunkTable[DATA_CHUNK] = std::make_shared<Chunks::DATA::DATAChunk>(this);
     m_ChunkTable[COMM_CHUNK] = std::make_shared<Chunks::COMM::COMMChunk>();
     m_ChunkTable[SSND_CHUNK] = std::make_shared<Chunks::SSND::SSNDChunk>();
     m_ChunkTable[BEXT_CHUNK] = std::make_shared<Chunks::BEXT::BEXTChunk>();
+    m_ChunkTable[IXML_CHUNK] = std::make_shared<Chunks::IXML::IXMLChunk>();
     m_ChunkTable[UMID_CHUNK] = std::make_shared<Chunks::UMID::UMIDChunk>();
 
     try {

@@ -23,6 +23,9 @@ class DATAChunk;
 namespace BEXT {
 class BEXTChunk;
 }
+namespace IXML {
+class IXMLChunk;
+}
 namespace UMID {
 class UMIDChunk;
 }
@@ -131,6 +134,10 @@ struct ChunkKey<Chunks::DATA::DATAChunk> {
 template <>
 struct ChunkKey<Chunks::BEXT::BEXTChunk> {
     static constexpr OrloStream::SupportedChunks value = OrloStream::BEXT_CHUNK;
+};
+template <>
+struct ChunkKey<Chunks::IXML::IXMLChunk> {
+    static constexpr OrloStream::SupportedChunks value = OrloStream::IXML_CHUNK;
 };
 template <>
 struct ChunkKey<Chunks::UMID::UMIDChunk> {

@@ -8,10 +8,14 @@ target_sources(OrloPlugin PRIVATE
     ${CMAKE_CURRENT_LIST_DIR}/DS64Chunk.cpp
     ${CMAKE_CURRENT_LIST_DIR}/ExtendedFloat.cpp
     ${CMAKE_CURRENT_LIST_DIR}/FMTChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/IXMLChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/IXMLTextParsers.cpp
     ${CMAKE_CURRENT_LIST_DIR}/OrloStream.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/ParceRawIXML.cpp
     ${CMAKE_CURRENT_LIST_DIR}/ParseOriginationTime.cpp
     ${CMAKE_CURRENT_LIST_DIR}/PerformAdditionalInitialization.cpp
     ${CMAKE_CURRENT_LIST_DIR}/ReadBytes.cpp
     ${CMAKE_CURRENT_LIST_DIR}/SSNDChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/SplitString.cpp
     ${CMAKE_CURRENT_LIST_DIR}/UMIDChunk.cpp
     ${CMAKE_CURRENT_LIST_DIR}/int24.cpp)

@@ -1,0 +1,27 @@
+#pragma once
+/// The `iXML` chunk: production metadata as XML text, with two faults of
+/// known writers mended before anyone parses it.
+#include <string>
+
+#include "reader/Chunk.h"
+#include "reader/ChunkIds.h"
+
+namespace Chunks {
+namespace IXML {
+
+class IXMLChunk : public Chunk {
+public:
+    /// Refuses an empty chunk. Reads the whole padded payload, cuts it after
+    /// its last ">" (recorders pad behind the root element) and corrects the
+    /// first "encording" to "encoding" (a writer misspells its declaration).
+    bool InitChunkFromStream(const ChunkHeader_t& header, FILE* file, bool wrongEndian) override;
+
+    /// A copy of the mended text.
+    std::string GetRawXml() const { return m_RawXml; }
+
+private:
+    std::string m_RawXml;
+};
+
+}  // namespace IXML
+}  // namespace Chunks

@@ -1,0 +1,40 @@
+#pragma once
+/// Readers of iXML element texts. Each reports success and leaves its output
+/// alone on failure. Numbers are read as a text stream reads them: leading
+/// digits count and trailing text is ignored.
+#include <sstream>
+#include <string>
+
+#include "aaf/AAFTypes.h"
+#include "strings/ZEBString.h"
+
+namespace Chunks {
+namespace IXML {
+
+/// Exactly "TRUE" or "FALSE".
+bool BoolFromString(const ZEB::ZEBString& text, bool& value);
+/// "DF" is drop frame, "NDF" is not.
+bool DropFrameFromString(const ZEB::ZEBString& text, bool& drop);
+/// "numerator/denominator", both present and read as signed integers.
+bool FrameRateFromString(ZEB::ZEBString text, _aafRational_t& rate);
+/// hi × 2^32 + lo, each read as an unsigned 32-bit integer; neither may be empty.
+bool SamplesFromString(ZEB::ZEBString hi, ZEB::ZEBString lo, unsigned long long& samples);
+/// Cuts `text` after its last ">".
+void TruncateIXMLString(std::string& text);
+
+/// The UTF-8 text of a string.
+std::string UTF8Text(const ZEB::ZEBString& text);
+
+/// A non-empty text read as T (unsigned 16- or 32-bit).
+template <typename T>
+bool IntegerFromZEBString(ZEB::ZEBString text, T& value) {
+    if (text.IsEmpty()) return false;
+    std::istringstream stream(UTF8Text(text));
+    T read{};
+    if (!(stream >> read)) return false;
+    value = read;
+    return true;
+}
+
+}  // namespace IXML
+}  // namespace Chunks
