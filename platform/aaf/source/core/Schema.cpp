@@ -9,7 +9,20 @@
 
 namespace aafmodel {
 
-Schema::Schema() = default;
+// Room for the built-in definitions and a few registered at run time, so
+// that making a file does not grow the tables step by step.
+Schema::Schema() {
+    m_classes.reserve(48);
+    m_types.reserve(64);
+    m_dataDefs.reserve(8);
+    m_properties.reserve(128);
+    m_classById.reserve(48);
+    m_typeById.reserve(64);
+    m_dataDefById.reserve(8);
+    m_classOrder.reserve(48);
+    m_typeOrder.reserve(64);
+    m_dataDefOrder.reserve(8);
+}
 Schema::~Schema() = default;
 
 Schema* Schema::Create() {
