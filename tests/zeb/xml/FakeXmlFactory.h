@@ -1,14 +1,16 @@
 #pragma once
-/// A component factory that makes fake readers and recording writers, with
-/// results a test chooses, and logs what they are asked.
+/// A component factory that is also the reader it makes, handing out a fake
+/// DOM's root with results a test chooses, and makes recording writers.
+/// Releasing never frees it; its count tells whether references came back.
 #include <string>
 #include <vector>
 
-#include "FakeXmlParser.h"
+#include "FakeXmlNode.h"
 #include "RecordingXmlWriter.h"
 #include "tov/ITOVComponentFactory.h"
+#include "tov/ITOVXmlParser.h"
 
-class FakeXmlFactory : public ITOVComponentFactory {
+class FakeXmlFactory : public ITOVComponentFactory, public UTIL::ITOVXmlParser {
 public:
     TOVRESULT QueryInterface(const _tovUID&, void** out) override {
         *out = nullptr;
@@ -18,35 +20,38 @@ public:
     uint32_t Release() override { return --refs; }
     TOVRESULT CreateComponent(const _tovUID& compID, ITOVUnknown*, const _tovUID&, void** out) override {
         *out = nullptr;
-        if (createResult < 0) return createResult;
-        if (nullComponent) return TOV_OK;
+        if (createResult < 0 || nullComponent) return createResult;
         if (compID == UTIL::CompID_TOVXmlReader) {
-            *out = static_cast<UTIL::ITOVXmlParser*>(new FakeXmlParser(log, parseResult, rootResult, root, live));
-        } else if (compID == UTIL::CompID_TOVXmlWriter) {
-            *out = static_cast<UTIL::ITOVXmlWriter*>(new RecordingXmlWriter(log, &live));
+            *out = static_cast<UTIL::ITOVXmlParser*>(this);
+            AddRef();
         } else {
-            return CLASS_E_CLASSNOTAVAILABLE;
+            *out = static_cast<UTIL::ITOVXmlWriter*>(new RecordingXmlWriter(log, &writers));
         }
         return TOV_OK;
     }
-    TOVRESULT GetClassFactory(const _tovUID&, const _tovUID&, void** out) override {
-        *out = nullptr;
-        return E_NOTIMPL;
-    }
-    TOVRESULT GetComponentDefinition(const _tovUID&, const _tovUID&, void** out) override {
-        *out = nullptr;
-        return E_NOTIMPL;
-    }
+    TOVRESULT GetClassFactory(const _tovUID&, const _tovUID&, void**) override { return E_NOTIMPL; }
+    TOVRESULT GetComponentDefinition(const _tovUID&, const _tovUID&, void**) override { return E_NOTIMPL; }
 
+    TOVRESULT ParseFile(ITOVString*) override { return parseResult; }
+    TOVRESULT ParseText(ITOVString*) override { return parseResult; }
+    TOVRESULT GetRoot(ITOVUnknown** out) override {
+        *out = nullptr;
+        if (rootResult < 0 || !root) return rootResult;
+        *out = root->Dom();
+        root->AddRef();
+        return TOV_OK;
+    }
+    TOVRESULT GetLastError(ITOVString**) override { return E_NOTIMPL; }
+
+    /// One for the test; each document and each reader it holds add one.
     uint32_t refs = 1;
-    /// Readers and writers not yet freed.
-    int live = 0;
-    /// What readers and writers were asked, in order.
+    /// Writers not yet freed, and what they were asked, in order.
+    int writers = 0;
     std::vector<std::string> log;
     /// Creation fails with this, or succeeds with null.
     TOVRESULT createResult = TOV_OK;
     bool nullComponent = false;
-    /// What the readers made from now on answer.
+    /// What the reader answers; a null root is handed out as null with success.
     TOVRESULT parseResult = TOV_OK;
     TOVRESULT rootResult = TOV_OK;
     FakeXmlNode* root = nullptr;

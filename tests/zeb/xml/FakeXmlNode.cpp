@@ -1,6 +1,5 @@
 #include "FakeXmlNode.h"
 
-#include "FakeXmlNodeList.h"
 #include "strings/ZEBString.h"
 #include "tov/sdk/TOVFailureStyle.h"
 
@@ -35,13 +34,8 @@ TOVRESULT FakeXmlNode::QueryInterface(const _tovUID& iid, void** out) {
     return TOV_OK;
 }
 
-TOVRESULT FakeXmlNode::GetName(ITOVString** out) { return Text(m_Name, out); }
-
-TOVRESULT FakeXmlNode::GetValue(ITOVString** out) { return Text(m_Value, out); }
-
-TOVRESULT FakeXmlNode::Text(const std::string& text, ITOVString** out) const {
+TOVRESULT FakeXmlNode::Text(const std::string& text, ITOVString** out) {
     *out = nullptr;
-    if (nullStrings) return TOV_OK;
     return TOVGuarded([&] {
         ZEB::ZEBString::CreateString(out);
         return (*out)->Assign(kTOVUnicodeUTF8, reinterpret_cast<const unsigned char*>(text.c_str()),
@@ -49,18 +43,29 @@ TOVRESULT FakeXmlNode::Text(const std::string& text, ITOVString** out) const {
     });
 }
 
+TOVRESULT FakeXmlNode::HandOut(FakeXmlNode* node, UTIL::ITOVXmlDomNode** out) {
+    *out = node->Dom();
+    node->AddRef();
+    return TOV_OK;
+}
+
 TOVRESULT FakeXmlNode::GetChild(uint32_t index, UTIL::ITOVXmlDomNode** out) {
     ++fetches;
     *out = nullptr;
     if (nullChild) return TOV_OK;
-    if (index >= m_Children.size()) return TOV_E_OUTOFRANGE;
-    *out = m_Children[index]->Dom();
-    (*out)->AddRef();
-    return TOV_OK;
+    return index < m_Children.size() ? HandOut(m_Children[index], out) : TOV_E_OUTOFRANGE;
 }
 
 TOVRESULT FakeXmlNode::GetAttributes(UTIL::ITOVXmlDomNodeList** out) {
     ++fetches;
-    *out = nullAttributeList ? nullptr : new FakeXmlNodeList(m_Attributes);
+    *out = nullptr;
+    if (nullAttributeList) return TOV_OK;
+    *out = this;
+    AddRef();
     return TOV_OK;
+}
+
+TOVRESULT FakeXmlNode::GetItem(uint32_t index, UTIL::ITOVXmlDomNode** out) {
+    *out = nullptr;
+    return index < m_Attributes.size() ? HandOut(m_Attributes[index], out) : TOV_E_OUTOFRANGE;
 }

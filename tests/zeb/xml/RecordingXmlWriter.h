@@ -1,22 +1,32 @@
 #pragma once
-/// A writer that records each call as a line of text instead of writing XML.
+/// A writer that records each call as a line of text instead of writing XML,
+/// and frees itself at the last release.
 #include <string>
 #include <vector>
 
-#include "FakeUnknown.h"
 #include "strings/ZEBString.h"
 #include "tov/ITOVXmlWriter.h"
 
-class RecordingXmlWriter : public FakeUnknown<UTIL::ITOVXmlWriter> {
+class RecordingXmlWriter : public UTIL::ITOVXmlWriter {
 public:
     /// `live`, when given, counts writers not yet freed.
     explicit RecordingXmlWriter(std::vector<std::string>& log, int* live = nullptr) : m_Log(log), m_Live(live) {
         if (m_Live) ++*m_Live;
     }
-    ~RecordingXmlWriter() {
+    virtual ~RecordingXmlWriter() {
         if (m_Live) --*m_Live;
     }
 
+    TOVRESULT QueryInterface(const _tovUID&, void** out) override {
+        *out = nullptr;
+        return TOV_E_NOINTERFACE;
+    }
+    uint32_t AddRef() override { return ++m_Refs; }
+    uint32_t Release() override {
+        const uint32_t refs = --m_Refs;
+        if (refs == 0) delete this;
+        return refs;
+    }
     TOVRESULT Open(ITOVString* path) override { return Record("open " + (path ? Read(path) : "<memory>")); }
     TOVRESULT Close() override { return Record("close"); }
     TOVRESULT GetText(ITOVString** out) override {
@@ -34,9 +44,7 @@ public:
     }
 
 private:
-    static std::string Read(ITOVString* s) {
-        return reinterpret_cast<const char*>(ZEB::ZEBString(s, 0).GetUTF8String());
-    }
+    static std::string Read(ITOVString* s) { return reinterpret_cast<const char*>(ZEB::ZEBString(s, 0).GetUTF8String()); }
     TOVRESULT Record(const std::string& line) {
         m_Log.push_back(line);
         return TOV_OK;
@@ -44,4 +52,5 @@ private:
 
     std::vector<std::string>& m_Log;
     int* m_Live;
+    uint32_t m_Refs = 1;
 };

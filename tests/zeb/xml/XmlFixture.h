@@ -39,8 +39,8 @@ protected:
     }
     void TearDown() override {
         EXPECT_EQ(dom.Outstanding(), 0) << "a reference to a DOM node was not given back";
-        EXPECT_EQ(factory.refs, 1u) << "the factory's references are out of balance";
-        EXPECT_EQ(factory.live, 0) << "a reader or writer was not released";
+        EXPECT_EQ(factory.refs, 1u) << "a reference to the factory or its reader was not given back";
+        EXPECT_EQ(factory.writers, 0) << "a writer was not released";
         EXPECT_EQ(CTOVUnknown::GetActiveObjectCount(), m_StartObjects) << "a host object was leaked";
         ZEB::ZEBTerminate();
     }
