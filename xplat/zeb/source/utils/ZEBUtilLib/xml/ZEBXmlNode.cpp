@@ -30,8 +30,8 @@ ZEBXmlNode::ZEBXmlNode(UTIL::ITOVXmlDomNode* dom)
 }
 
 ZEBXmlNode::~ZEBXmlNode() {
-    DeleteChildren();
     if (m_pDom) m_pDom->Release();
+    DeleteChildren();
 }
 
 void ZEBXmlNode::DeleteChildren() {
