@@ -1,6 +1,7 @@
 #!/usr/bin/env bash
 # Installs what is missing, builds, and runs every test: once in a plain
-# build, once more under AddressSanitizer and UndefinedBehaviorSanitizer.
+# build, once more under AddressSanitizer and UndefinedBehaviorSanitizer; then
+# runs the fuzzer for a minute.
 set -euo pipefail
 root=$(cd "$(dirname "$0")/.." && pwd)
 bash "$root/scripts/install-deps.sh"
@@ -11,3 +12,6 @@ ctest --test-dir "$root/build" --output-on-failure -j "$(nproc)"
 bash "$root/scripts/build.sh" build-asan -DORLO_SANITIZE=ON -DORLO_BENCH=OFF -DCMAKE_BUILD_TYPE=Debug
 ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
     ctest --test-dir "$root/build-asan" --output-on-failure -j "$(nproc)"
+
+# The chunk-walk fuzzer, built with clang, for one minute under AddressSanitizer.
+bash "$root/scripts/fuzz.sh" 60

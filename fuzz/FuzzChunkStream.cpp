@@ -1,0 +1,73 @@
+// libFuzzer target: the whole chunk walk, and every accessor after it, over
+// any bytes. Each input is written to a memory file that the stream opens by
+// path, as it opens any file.
+#include <fcntl.h>
+#include <sys/mman.h>
+#include <unistd.h>
+
+#include <cstdint>
+#include <cstdlib>
+#include <stdexcept>
+#include <string>
+
+#include "reader/OrloStream.h"
+#include "startup/ZEBUtilLib.h"
+#include "tov/host/TOVHost.h"
+
+namespace {
+
+int g_memoryFile = -1;
+std::string g_path;
+
+// The lowest free descriptor: a stream that left its file open takes it.
+int LowestFreeDescriptor() {
+    const int fd = open("/dev/null", O_RDONLY);
+    close(fd);
+    return fd;
+}
+
+template <typename Get>
+void Ask(Get get) {
+    try {
+        get();
+    } catch (const std::exception&) {
+        // "value does not exist": the answer of a stream without the chunk.
+    }
+}
+
+}  // namespace
+
+extern "C" int LLVMFuzzerInitialize(int*, char***) {
+    // The reader logs through the utility library, which needs a host; lines
+    // are formatted at every level and dropped.
+    static TOVPtr<TOVHost> host = TOVHost::Create();
+    host->Console().SetVerbosity(~0u);
+    host->Console().SetSink([](uint32_t, const std::string&) {});
+    if (ZEB::ZEBInitialize(host.Get()) < 0) std::abort();
+    g_memoryFile = memfd_create("orlo-fuzz", 0);
+    if (g_memoryFile < 0) std::abort();
+    g_path = "/proc/self/fd/" + std::to_string(g_memoryFile);
+    return 0;
+}
+
+extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
+    if (ftruncate(g_memoryFile, 0) != 0) std::abort();
+    if (size > 0 && pwrite(g_memoryFile, data, size, 0) != static_cast<ssize_t>(size)) std::abort();
+
+    const int free = LowestFreeDescriptor();
+    {
+        const Orlo::OrloStream stream(g_path.c_str(), 255);
+        Ask([&] { return stream.GetChannelCount(); });
+        Ask([&] { return stream.GetBitsPerSample(); });
+        Ask([&] { return stream.GetIsDataFloatingPoint(); });
+        Ask([&] { return stream.GetSampleRate(); });
+        Ask([&] { return stream.GetSampleCount(); });
+        Ask([&] { return stream.GetIsDataWrongEndian(); });
+        Ask([&] { return stream.GetSampleSize(); });
+        Ask([&] { return stream.GetStartPosition(); });
+        Ask([&] { return stream.GetSamplePosition(1000); });
+    }
+
+    if (LowestFreeDescriptor() != free) std::abort();  // the stream left its file open
+    return 0;
+}
