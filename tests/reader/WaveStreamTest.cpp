@@ -184,6 +184,35 @@ TEST_F(ReaderTest, ZeroSizedDataIsWalkedAsChunks) {
     }
 }
 
+// Digital silence walked as chunks (a data size of 0) is a run of empty,
+// nameless chunks, 8 bytes each, passed over in bulk. A chunk behind the run
+// is found exactly when it stands on the 8-byte grid of the run.
+TEST_F(ReaderTest, SilenceWalkedAsChunksEndsWhereTheGridDoes) {
+    const struct {
+        size_t silence;
+        std::string tail;
+        bool umidFound;
+    } rows[] = {{8, "umid" + Bytes::LE32(24) + Samples(24), true},
+                {70000, "umid" + Bytes::LE32(24) + Samples(24), true},
+                {(1 << 16) * 2, "umid" + Bytes::LE32(24) + Samples(24), true},
+                {70004, "umid" + Bytes::LE32(24) + Samples(24), false},
+                {70000,
+                 "\x01"
+                 "abc" +
+                     Bytes::LE32(0) + "umid" + Bytes::LE32(24) + Samples(24),
+                 true},
+                {70000, "xyz", false},
+                {70000, "", false}};
+    for (const auto& row : rows) {
+        auto stream = Open(AudioFileWriter::Wave()
+                               .Chunk("fmt ", Fmt())
+                               .ChunkWithSize("data", 0, std::string(row.silence, '\0') + row.tail, false)
+                               .Bytes());
+        ASSERT_EQ(stream->GetError(), nullptr) << row.silence;
+        EXPECT_EQ(stream->HasChunk(OrloStream::UMID_CHUNK), row.umidFound) << row.silence << " " << row.tail.size();
+    }
+}
+
 TEST_F(ReaderTest, TrailingBytesShorterThanAHeaderAreIgnored) {
     for (size_t tail = 1; tail < 8; ++tail) {
         auto stream = Open(PlainWave() + Samples(tail));

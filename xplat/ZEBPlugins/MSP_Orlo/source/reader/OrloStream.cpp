@@ -2,6 +2,7 @@
 
 #include <cstring>
 #include <stdexcept>
+#include <vector>
 
 #include "reader/BEXTChunk.h"
 #include "reader/COMMChunk.h"
@@ -22,6 +23,7 @@ namespace Orlo {
 
 namespace {
 const char* const kNoValue = "value does not exist";
+const std::string kHeaderMessage = "Expected chunk header";
 }  // namespace
 
 OrloStream::OrloStream(const char* path, unsigned int chunks) {
@@ -56,7 +58,9 @@ OrloStream::OrloStream(const char* path, unsigned int chunks) {
     m_File = nullptr;
 }
 
-void OrloStream::ReadFourBytes(char* out, const char* message) { HelperFunctions::ReadBytes(out, 4, m_File, message); }
+void OrloStream::ReadFourBytes(char* out, const std::string& message) {
+    HelperFunctions::ReadBytes(out, 4, m_File, message);
+}
 
 void OrloStream::ReadAndParseFile(unsigned int chunks) {
     if (chunks == 0) throw "No chunks specified for reading!";
@@ -89,15 +93,35 @@ void OrloStream::ReadAndParseFile(unsigned int chunks) {
     }
 }
 
+// A file whose data size was never written (a recorder that lost power) has
+// its samples walked as chunks, and digital silence there is a run of empty,
+// nameless chunks of 8 bytes each. Walked one by one, a muted gigabyte takes
+// many seconds; this passes over the run at read speed and stops where the
+// walk would find something else, so the outcome is the same.
+void OrloStream::SkipEmptyChunks() {
+    static const char kEmpty[8] = {};
+    off_t position = ftello(m_File);
+    if (position < 0) return;
+    std::vector<char> block(1 << 16);
+    for (;;) {
+        const size_t got = std::fread(block.data(), 1, block.size(), m_File);
+        size_t empty = 0;
+        while (empty + 8 <= got && std::memcmp(block.data() + empty, kEmpty, 8) == 0) empty += 8;
+        position += static_cast<off_t>(empty);
+        if (empty < block.size()) break;
+    }
+    fseeko(m_File, position, SEEK_SET);
+}
+
 bool OrloStream::ReadChunkHeader(Chunks::ChunkHeader_t* header) {
     const off_t position = ftello(m_File);
     if (position < 0) return false;
     // A trailing run of up to 7 bytes is no chunk: writers leave such tails.
     if (position >= m_FileSize || m_FileSize - position < 8) return false;
     char id[5] = {};
-    ReadFourBytes(id, "Expected chunk header");
+    ReadFourBytes(id, kHeaderMessage);
     char size[4];
-    ReadFourBytes(size, "Expected chunk header");
+    ReadFourBytes(size, kHeaderMessage);
     header->chunkId = id;
     std::memcpy(&header->chunkSize, size, 4);
     if (m_FileWrongEndian) HelperFunctions::SwapULong(header->chunkSize);
@@ -111,7 +135,11 @@ void OrloStream::ReadAndInitChunk(Chunks::ChunkHeader_t header) {
     const unsigned int type = ConvertStrToChunkType(header.chunkId);
     const auto parser = m_ChunkTable.find(static_cast<SupportedChunks>(type));
     if (parser == m_ChunkTable.end()) {
-        fseeko(m_File, header.chunkSize, SEEK_CUR);
+        if (header.chunkSize != 0) {
+            fseeko(m_File, header.chunkSize, SEEK_CUR);
+        } else if (header.chunkId.empty()) {
+            SkipEmptyChunks();
+        }
         return;
     }
     if (type == DATA_CHUNK && !HasChunk(FMT_CHUNK)) throw "Malformed WAVE file with 'DATA' before 'fmt '";

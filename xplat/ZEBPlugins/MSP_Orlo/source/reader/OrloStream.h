@@ -100,7 +100,8 @@ private:
     void ReadAndParseFile(unsigned int chunks);
     bool ReadChunkHeader(Chunks::ChunkHeader_t* header);
     void ReadAndInitChunk(Chunks::ChunkHeader_t header);
-    void ReadFourBytes(char* out, const char* message);
+    void ReadFourBytes(char* out, const std::string& message);
+    void SkipEmptyChunks();
     /// The value `get` takes from parser First if accepted, else from Second;
     /// neither throws std::logic_error("value does not exist").
     template <typename First, typename Second, typename Value, typename Get>

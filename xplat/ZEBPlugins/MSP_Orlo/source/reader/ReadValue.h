@@ -2,14 +2,16 @@
 /// Reads one integer field of a chunk, swapped when the file's byte order is
 /// not the host's.
 #include <cstdio>
+#include <string>
 
 #include "reader/ByteSwap.h"
 #include "reader/ReadBytes.h"
 
 namespace HelperFunctions {
 
-/// The short-read message of every fixed field of a chunk.
-inline constexpr char kShortReadMessage[] = "Some default error";
+/// The short-read message of every fixed field of a chunk; made once, as the
+/// walk reads many small fields.
+inline const std::string kShortReadMessage = "Some default error";
 
 template <typename T>
 T ReadValue(FILE* file, bool wrongEndian) {
