@@ -21,6 +21,13 @@ bool Decode(const unsigned short* text, size_t n, std::u32string& out) {
 bool Decode(const unsigned int* text, size_t n, std::u32string& out) { return UnicodeCodec::DecodeUTF32(text, n, out); }
 bool Decode(const wchar_t* text, size_t n, std::u32string& out) { return UnicodeCodec::DecodeUTF32(text, n, out); }
 
+// Bytes of a UTF-8 input before its first zero within `n`.
+size_t UTF8Length(const unsigned char* text, unsigned int n) {
+    size_t length = 0;
+    while (length < n && text[length] != 0) ++length;
+    return length;
+}
+
 // Input text: up to `n` units, ending at the first zero.
 template <class Unit>
 std::u32string ReadText(const Unit* text, unsigned int n) {
@@ -114,7 +121,17 @@ TOVRESULT HostString::Assign(_tovUnicodeType type, ITOVString* source) {
 }
 
 TOVRESULT HostString::Assign(_tovUnicodeType type, const unsigned char* text, unsigned int n) {
-    return TOVGuarded([&] { return AssignText(type, ReadText(text, n)); });
+    return TOVGuarded([&] {
+        const TOVRESULT result = AssignText(type, ReadText(text, n));
+        // Valid UTF-8 is the one encoding of its code points, so the input is
+        // the UTF-8 view as it stands: large texts handed in and read back as
+        // UTF-8 (XML documents) are not encoded again.
+        if (result >= 0 && text) {
+            m_UTF8.assign(reinterpret_cast<const char*>(text), m_Text.empty() ? 0 : UTF8Length(text, n));
+            m_UTF8Fresh = true;
+        }
+        return result;
+    });
 }
 
 TOVRESULT HostString::Assign(_tovUnicodeType type, const unsigned short* text, unsigned int n) {
@@ -215,6 +232,8 @@ void HostString::Commit(const std::u32string& text, _tovUnicodeType type) {
     }
     m_Text.swap(stored);
     m_Type = type;
+    m_UTF8Fresh = m_UTF16Fresh = m_UTF32Fresh = false;
+    m_WideHandedOut = false;  // the storage handed out is no longer valid
 }
 
 // ---- Views and counts
@@ -222,7 +241,8 @@ void HostString::Commit(const std::u32string& text, _tovUnicodeType type) {
 TOVRESULT HostString::GetUTF8String(const unsigned char** out) {
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
-        Refresh(m_UTF8, UnicodeCodec::EncodeUTF8(std::wstring_view(m_Text)));
+        if (!m_UTF8Fresh || m_WideHandedOut) Refresh(m_UTF8, UnicodeCodec::EncodeUTF8(std::wstring_view(m_Text)));
+        m_UTF8Fresh = true;
         *out = reinterpret_cast<const unsigned char*>(m_UTF8.c_str());
         return TOV_OK;
     });
@@ -231,9 +251,12 @@ TOVRESULT HostString::GetUTF8String(const unsigned char** out) {
 TOVRESULT HostString::GetUTF16String(const unsigned short** out) {
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
-        std::vector<unsigned short> units = UnicodeCodec::EncodeUTF16(CodePoints());
-        units.push_back(0);
-        Refresh(m_UTF16, std::move(units));
+        if (!m_UTF16Fresh || m_WideHandedOut) {
+            std::vector<unsigned short> units = UnicodeCodec::EncodeUTF16(CodePoints());
+            units.push_back(0);
+            Refresh(m_UTF16, std::move(units));
+        }
+        m_UTF16Fresh = true;
         *out = m_UTF16.data();
         return TOV_OK;
     });
@@ -242,9 +265,12 @@ TOVRESULT HostString::GetUTF16String(const unsigned short** out) {
 TOVRESULT HostString::GetUTF32String(const unsigned int** out) {
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
-        std::vector<unsigned int> units = UnicodeCodec::EncodeUTF32(CodePoints());
-        units.push_back(0);
-        Refresh(m_UTF32, std::move(units));
+        if (!m_UTF32Fresh || m_WideHandedOut) {
+            std::vector<unsigned int> units = UnicodeCodec::EncodeUTF32(CodePoints());
+            units.push_back(0);
+            Refresh(m_UTF32, std::move(units));
+        }
+        m_UTF32Fresh = true;
         *out = m_UTF32.data();
         return TOV_OK;
     });
@@ -252,6 +278,7 @@ TOVRESULT HostString::GetUTF32String(const unsigned int** out) {
 
 TOVRESULT HostString::GetWCHARString(wchar_t** out) {
     if (!out) return TOV_E_INVALIDARG;
+    m_WideHandedOut = true;
     *out = m_Text.data();
     return TOV_OK;
 }
@@ -285,6 +312,8 @@ std::u32string HostString::CodePoints() const {
 
 std::u32string HostString::TextOf(ITOVString* source) {
     if (!source) Fail(TOV_E_INVALIDARG);
+    // Between two strings of this host, the code points are at hand.
+    if (auto* same = dynamic_cast<HostString*>(source)) return same->CodePoints();
     const unsigned int* units = nullptr;
     TOVCheck(source->GetUTF32String(&units));
     if (!units) Fail(TOV_E_POINTER);

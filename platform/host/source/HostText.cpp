@@ -22,11 +22,12 @@ TOVRESULT Make(const std::string& utf8, ITOVString** out) {
 
 std::string Read(ITOVString* text) {
     if (!text) throw static_cast<int>(TOV_E_POINTER);
-    TOVPtr<ITOVString> copy;
-    TOVCheck(text->ConvertedCopy(kTOVUnicodeUTF8, copy.OutT()));
+    // The UTF-8 view leaves the stored encoding alone, and the text holds no
+    // zero, so the view's terminator marks its end.
     const unsigned char* bytes = nullptr;
-    TOVCheck(copy->GetUTF8String(&bytes));
-    return std::string(reinterpret_cast<const char*>(bytes), copy->GetByteCount());
+    TOVCheck(text->GetUTF8String(&bytes));
+    if (!bytes) throw static_cast<int>(TOV_E_POINTER);
+    return std::string(reinterpret_cast<const char*>(bytes));
 }
 
 }  // namespace HostText

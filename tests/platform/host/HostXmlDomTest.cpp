@@ -80,6 +80,17 @@ TEST_F(HostXmlDom, ChildrenKeepDocumentOrderAndTheirTypes) {
     EXPECT_EQ(out, nullptr);
 }
 
+TEST_F(HostXmlDom, IndentationIsNotContent) {
+    TOVPtr<ITOVXmlDomNode> root = Root("<BWFXML>\n  <SCENE>  </SCENE>\n  <NOTE>a <B>b</B> c</NOTE>\n</BWFXML>\n");
+    ASSERT_EQ(root->GetChildCount(), 2u) << "the line breaks and indents between elements are gone";
+    TOVPtr<ITOVXmlDomNode> scene = Child(root.Get(), 0);
+    ASSERT_EQ(scene->GetChildCount(), 1u);
+    EXPECT_EQ(Value(Child(scene.Get(), 0).Get()), "  ") << "a leaf element keeps its text as written";
+    TOVPtr<ITOVXmlDomNode> note = Child(root.Get(), 1);
+    ASSERT_EQ(note->GetChildCount(), 3u);
+    EXPECT_EQ(Value(Child(note.Get(), 2).Get()), " c") << "mixed content keeps its spaces";
+}
+
 TEST_F(HostXmlDom, AttributesComeAsAListOfAttributeViews) {
     TOVPtr<ITOVXmlDomNode> root = Root(R"(<TRACK index="2" name="Boom &amp; mix"/>)");
     EXPECT_EQ(root->HasAttributes(), 1);

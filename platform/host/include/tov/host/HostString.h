@@ -131,6 +131,12 @@ private:
     std::string m_UTF8;
     std::vector<unsigned short> m_UTF16;
     std::vector<unsigned int> m_UTF32;
+    /// Which views match the text. A view is remade only when the text changed
+    /// or while the wide storage is handed out, as writes through it bypass Commit.
+    bool m_UTF8Fresh = false;
+    bool m_UTF16Fresh = false;
+    bool m_UTF32Fresh = false;
+    bool m_WideHandedOut = false;
     unsigned char* m_External = nullptr;
     unsigned int m_ExternalSize = 0;
 };

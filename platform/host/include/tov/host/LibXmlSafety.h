@@ -14,7 +14,9 @@ public:
     /// libxml2 enforces this depth while it builds a tree; a SAX reader counts itself.
     static constexpr int kMaxDepth = 256;
     /// Parser options: never XML_PARSE_NOENT, XML_PARSE_DTDLOAD or XML_PARSE_HUGE.
-    static constexpr int kOptions = XML_PARSE_NONET | XML_PARSE_NOERROR | XML_PARSE_NOWARNING;
+    /// Whitespace-only text between elements is indentation, not content, and
+    /// is left out of the tree; text of a leaf element and mixed content stay whole.
+    static constexpr int kOptions = XML_PARSE_NONET | XML_PARSE_NOERROR | XML_PARSE_NOWARNING | XML_PARSE_NOBLANKS;
 
     /// Makes `sax` refuse entity declarations by stopping the parse. The
     /// handler's user data must be the parser context.

@@ -1,5 +1,6 @@
 #include "reader/ParceRawIXML.h"
 
+#include <map>
 #include <sstream>
 #include <vector>
 
@@ -18,11 +19,18 @@ namespace E = IXMLElements;
 
 ZEBString Name(const char* text) { return ZEBString(reinterpret_cast<const unsigned char*>(text)); }
 
-ZEBXmlElement* Child(ZEBXmlElement* parent, const char* name) { return parent->GetElement(Name(name), 0); }
+// Each element name is made into a host string once per parse, not per lookup.
+using Names = std::map<const char*, ZEBString>;
+
+ZEBXmlElement* Child(Names& names, ZEBXmlElement* parent, const char* name) {
+    auto found = names.find(name);
+    if (found == names.end()) found = names.emplace(name, Name(name)).first;
+    return parent->GetElement(found->second, 0);
+}
 
 // An element that is there with a text that is not empty; the text goes to `text`.
-bool NonEmptyText(ZEBXmlElement* parent, const char* name, ZEBString& text) {
-    ZEBXmlElement* element = Child(parent, name);
+bool NonEmptyText(Names& names, ZEBXmlElement* parent, const char* name, ZEBString& text) {
+    ZEBXmlElement* element = Child(names, parent, name);
     if (!element) return false;
     text = element->GetText();
     return !text.IsEmpty();
@@ -31,29 +39,29 @@ bool NonEmptyText(ZEBXmlElement* parent, const char* name, ZEBString& text) {
 using FlagSetter = void (IXMLData::*)(bool);
 
 // A text field counts when its element is there and not empty.
-void ReadText(ZEBXmlElement* root, const char* name, IXMLData& data, void (IXMLData::*set)(const ZEBString&),
+void ReadText(Names& names, ZEBXmlElement* root, const char* name, IXMLData& data, void (IXMLData::*set)(const ZEBString&),
               FlagSetter setHas) {
     ZEBString text;
-    const bool has = NonEmptyText(root, name, text);
+    const bool has = NonEmptyText(names, root, name, text);
     if (has) (data.*set)(text);
     (data.*setHas)(has);
 }
 
 // A flag counts when its element holds exactly "TRUE" or "FALSE".
-void ReadBool(ZEBXmlElement* root, const char* name, IXMLData& data, void (IXMLData::*set)(const bool&),
+void ReadBool(Names& names, ZEBXmlElement* root, const char* name, IXMLData& data, void (IXMLData::*set)(const bool&),
               FlagSetter setHas) {
     ZEBString text;
     bool value = false;
-    const bool has = NonEmptyText(root, name, text) && BoolFromString(text, value);
+    const bool has = NonEmptyText(names, root, name, text) && BoolFromString(text, value);
     if (has) (data.*set)(value);
     (data.*setHas)(has);
 }
 
-void ReadVersion(ZEBXmlElement* root, IXMLData& data) {
+void ReadVersion(Names& names, ZEBXmlElement* root, IXMLData& data) {
     ZEBString text;
     double version = 0;
     bool has = false;
-    if (NonEmptyText(root, E::IXML_VERSION, text)) {
+    if (NonEmptyText(names, root, E::IXML_VERSION, text)) {
         std::istringstream stream(UTF8Text(text));
         has = static_cast<bool>(stream >> version);
     }
@@ -61,8 +69,33 @@ void ReadVersion(ZEBXmlElement* root, IXMLData& data) {
     data.SetHasVersion(has);
 }
 
-void ReadTrackList(ZEBXmlElement* root, IXMLData& data) {
-    ZEBXmlElement* list = Child(root, E::TRACK_LIST);
+void ReadTrack(Names& names, ZEBXmlElement* element, IXMLData& data) {
+    if (!element) return;
+    const ZEBString tag = element->GetTagName();
+    if (tag.IsEmpty() || !(tag == reinterpret_cast<const unsigned char*>(E::TRACK))) return;
+
+    IXMLTrack track;
+    track.SetName(Name(""));
+    ZEBString text;
+    uint16_t index = 0;
+    if (NonEmptyText(names, element, E::CHANNEL_INDEX, text) && IntegerFromZEBString(text, index)) {
+        track.SetChannelIndex(index);
+        track.SetHasChannelIndex(true);
+    }
+    if (NonEmptyText(names, element, E::INTERLEAVE_INDEX, text) && IntegerFromZEBString(text, index)) {
+        track.SetInterleaveIndex(index);
+        track.SetHasInterleaveIndex(true);
+    }
+    if (NonEmptyText(names, element, E::NAME, text)) {
+        track.SetName(text);
+        track.SetHasName(true);
+    }
+    // Whether the list is usable is the clip model's decision.
+    data.AddTrackToTrackList(track);
+}
+
+void ReadTrackList(Names& names, ZEBXmlElement* root, IXMLData& data) {
+    ZEBXmlElement* list = Child(names, root, E::TRACK_LIST);
     if (!list) {
         data.SetHasTracksCount(false);
         data.SetHasTracksList(false);
@@ -71,17 +104,17 @@ void ReadTrackList(ZEBXmlElement* root, IXMLData& data) {
     std::vector<ZEBXmlElement*> children;
     const TOVRESULT result = list->GetAllElements(children);
     data.SetHasTracksList(result == TOV_OK && !children.empty());
-    for (ZEBXmlElement* child : children) GetTrackFromXMLWithNameCheck(child, &data);
+    for (ZEBXmlElement* child : children) ReadTrack(names, child, data);
 
     ZEBString text;
     uint16_t count = 0;
-    const bool has = NonEmptyText(list, E::TRACK_COUNT, text) && IntegerFromZEBString(text, count);
+    const bool has = NonEmptyText(names, list, E::TRACK_COUNT, text) && IntegerFromZEBString(text, count);
     if (has) data.SetTracksCount(count);
     data.SetHasTracksCount(has);
 }
 
-void ReadSpeed(ZEBXmlElement* root, IXMLData& data) {
-    ZEBXmlElement* element = Child(root, E::SPEED);
+void ReadSpeed(Names& names, ZEBXmlElement* root, IXMLData& data) {
+    ZEBXmlElement* element = Child(names, root, E::SPEED);
     if (!element) {
         data.SetHasSpeed(false);
         return;
@@ -90,18 +123,18 @@ void ReadSpeed(ZEBXmlElement* root, IXMLData& data) {
     ZEBString text;
 
     _aafRational_t rate{0, 0};
-    const bool hasRate = NonEmptyText(element, E::TIMECODE_RATE, text) && FrameRateFromString(text, rate);
+    const bool hasRate = NonEmptyText(names, element, E::TIMECODE_RATE, text) && FrameRateFromString(text, rate);
     speed.SetTimeCodeRate(hasRate ? rate : _aafRational_t{0, 0});
     speed.SetHasTimeCodeRate(hasRate);
 
     bool drop = false;
-    if (NonEmptyText(element, E::TIMECODE_FLAG, text) && DropFrameFromString(text, drop)) {
+    if (NonEmptyText(names, element, E::TIMECODE_FLAG, text) && DropFrameFromString(text, drop)) {
         speed.SetTimeCodeFlag(drop);
         speed.SetHasTimeCodeFlag(true);
     }
 
-    ZEBXmlElement* hi = Child(element, E::TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_HI);
-    ZEBXmlElement* lo = Child(element, E::TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_LO);
+    ZEBXmlElement* hi = Child(names, element, E::TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_HI);
+    ZEBXmlElement* lo = Child(names, element, E::TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_LO);
     unsigned long long samples = 0;
     if (hi && lo && SamplesFromString(hi->GetText(), lo->GetText(), samples)) {
         speed.SetSamplesSinceMidnight(samples);
@@ -109,12 +142,12 @@ void ReadSpeed(ZEBXmlElement* root, IXMLData& data) {
     }
 
     uint32_t digitizer = 0;
-    if (ZEBXmlElement* e = Child(element, E::DIGITIZER_SAMPLE_RATE); e && IntegerFromZEBString(e->GetText(), digitizer)) {
+    if (ZEBXmlElement* e = Child(names, element, E::DIGITIZER_SAMPLE_RATE); e && IntegerFromZEBString(e->GetText(), digitizer)) {
         speed.SetDigitizerSampleRate(digitizer);
         speed.SetHasDigitizerSampleRate(true);
     }
     uint32_t stampRate = 0;
-    if (ZEBXmlElement* e = Child(element, E::TIMESTAMP_SAMPLE_RATE); e && IntegerFromZEBString(e->GetText(), stampRate)) {
+    if (ZEBXmlElement* e = Child(names, element, E::TIMESTAMP_SAMPLE_RATE); e && IntegerFromZEBString(e->GetText(), stampRate)) {
         speed.SetTimeStampSampleRate(stampRate);
         speed.SetHasTimeStampSampleRate(true);
     }
@@ -128,28 +161,9 @@ void ReadSpeed(ZEBXmlElement* root, IXMLData& data) {
 }  // namespace
 
 void GetTrackFromXMLWithNameCheck(ZEBXmlElement* element, IXMLData* data) {
-    if (!element) return;
-    const ZEBString tag = element->GetTagName();
-    if (tag.IsEmpty() || !(tag == reinterpret_cast<const unsigned char*>(E::TRACK))) return;
-
-    IXMLTrack track;
-    track.SetName(Name(""));
-    ZEBString text;
-    uint16_t index = 0;
-    if (NonEmptyText(element, E::CHANNEL_INDEX, text) && IntegerFromZEBString(text, index)) {
-        track.SetChannelIndex(index);
-        track.SetHasChannelIndex(true);
-    }
-    if (NonEmptyText(element, E::INTERLEAVE_INDEX, text) && IntegerFromZEBString(text, index)) {
-        track.SetInterleaveIndex(index);
-        track.SetHasInterleaveIndex(true);
-    }
-    if (NonEmptyText(element, E::NAME, text)) {
-        track.SetName(text);
-        track.SetHasName(true);
-    }
-    // Whether the list is usable is the clip model's decision.
-    data->AddTrackToTrackList(track);
+    if (!data) return;
+    Names names;
+    ReadTrack(names, element, *data);
 }
 
 TOVRESULT ParceRawIXML(const std::string& rawXml, ITOVComponentFactory* factory, IXMLData& data) {
@@ -161,23 +175,24 @@ TOVRESULT ParceRawIXML(const std::string& rawXml, ITOVComponentFactory* factory,
         if (loaded < 0) return loaded;
         ZEBXmlElement* root = document.DocumentElement();
         if (!root) return ZEB_E_NOTREADY;
+        Names names;
 
         // The order in which recorders' files have always been read.
-        ReadText(root, E::PROJECT, data, &IXMLData::SetProject, &IXMLData::SetHasProject);
-        ReadVersion(root, data);
-        ReadText(root, E::SCENE, data, &IXMLData::SetScene, &IXMLData::SetHasScene);
-        ReadText(root, E::TAKE, data, &IXMLData::SetTake, &IXMLData::SetHasTake);
-        ReadText(root, E::FILE_UID, data, &IXMLData::SetFileUID, &IXMLData::SetHasFileUID);
-        ReadBool(root, E::CIRCLED, data, &IXMLData::SetCircled, &IXMLData::SetHasCircled);
-        ReadText(root, E::UBITS, data, &IXMLData::SetUBITS, &IXMLData::SetHasUBITS);
-        ReadText(root, E::TAPE, data, &IXMLData::SetTape, &IXMLData::SetHasTape);
-        ReadText(root, E::NOTE, data, &IXMLData::SetNotes, &IXMLData::SetHasNotes);
-        ReadTrackList(root, data);
-        ReadSpeed(root, data);
-        ReadText(root, E::USER, data, &IXMLData::SetUser, &IXMLData::SetHasUser);
-        ReadBool(root, E::NO_GOOD, data, &IXMLData::SetNoGood, &IXMLData::SetHasNoGood);
-        ReadBool(root, E::FALSE_START, data, &IXMLData::SetFalseStart, &IXMLData::SetHasFalseStart);
-        ReadBool(root, E::WILD_TRACK, data, &IXMLData::SetWildTrack, &IXMLData::SetHasWildTrack);
+        ReadText(names, root, E::PROJECT, data, &IXMLData::SetProject, &IXMLData::SetHasProject);
+        ReadVersion(names, root, data);
+        ReadText(names, root, E::SCENE, data, &IXMLData::SetScene, &IXMLData::SetHasScene);
+        ReadText(names, root, E::TAKE, data, &IXMLData::SetTake, &IXMLData::SetHasTake);
+        ReadText(names, root, E::FILE_UID, data, &IXMLData::SetFileUID, &IXMLData::SetHasFileUID);
+        ReadBool(names, root, E::CIRCLED, data, &IXMLData::SetCircled, &IXMLData::SetHasCircled);
+        ReadText(names, root, E::UBITS, data, &IXMLData::SetUBITS, &IXMLData::SetHasUBITS);
+        ReadText(names, root, E::TAPE, data, &IXMLData::SetTape, &IXMLData::SetHasTape);
+        ReadText(names, root, E::NOTE, data, &IXMLData::SetNotes, &IXMLData::SetHasNotes);
+        ReadTrackList(names, root, data);
+        ReadSpeed(names, root, data);
+        ReadText(names, root, E::USER, data, &IXMLData::SetUser, &IXMLData::SetHasUser);
+        ReadBool(names, root, E::NO_GOOD, data, &IXMLData::SetNoGood, &IXMLData::SetHasNoGood);
+        ReadBool(names, root, E::FALSE_START, data, &IXMLData::SetFalseStart, &IXMLData::SetHasFalseStart);
+        ReadBool(names, root, E::WILD_TRACK, data, &IXMLData::SetWildTrack, &IXMLData::SetHasWildTrack);
 
         data.parsed = true;
         return TOV_OK;

@@ -88,6 +88,10 @@ ZEBString::ZEBString(const ZEBString& other) : ZEBString() {
     TOVCheck(source->ConvertedCopy(source->GetUnicodeType(), &m_pString));
 }
 
+ZEBString::ZEBString(ZEBString&& other) noexcept : m_pString(other.m_pString), m_Release(other.m_Release) {
+    other.m_pString = nullptr;
+}
+
 ZEBString::~ZEBString() {
     if (m_pString && m_Release) m_pString->Release();
     m_pString = nullptr;

@@ -35,6 +35,8 @@ public:
     ZEBString(ITOVString* string, int release);
     /// A converted copy in the source's own encoding: the two never share text.
     ZEBString(const ZEBString& other);
+    /// Takes over `other`'s string and release flag; `other` is left null.
+    ZEBString(ZEBString&& other) noexcept;
     virtual ~ZEBString();
 
     /// A bare new string component; `*out` owns one reference.

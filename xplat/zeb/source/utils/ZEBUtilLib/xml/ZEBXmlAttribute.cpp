@@ -78,7 +78,7 @@ ZEBString ZEBXmlAttribute::FromDom(TOVRESULT (UTIL::ITOVXmlDomAttribute::*get)(I
 TOVRESULT ZEBXmlAttribute::SetName(const ZEBString& name) {
     return TOVGuarded([&] {
         if (!IsNew()) Throw(TOV_E_UNEXPECTED);
-        auto* owner = dynamic_cast<ZEBXmlElement*>(m_pOwner);
+        auto* owner = NodeAs<ZEBXmlElement>(m_pOwner);
         if (owner && owner->HasAttribute(name)) Throw(TOV_E_INVALIDARG);
         CopyStored(m_Name, name);
         if (owner) owner->RefreshAttributeIndex();

@@ -9,6 +9,8 @@ namespace XMLUtils {
 
 class ZEBXmlAttribute : public ZEBXmlNode {
 public:
+    static constexpr int32_t kNodeKind = 2;
+    int32_t NodeKind() const override { return kNodeKind; }
     /// Attributes made in memory, status new.
     ZEBXmlAttribute();
     explicit ZEBXmlAttribute(const ZEBString& name);

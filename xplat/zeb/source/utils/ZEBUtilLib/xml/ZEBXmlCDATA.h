@@ -8,6 +8,8 @@ namespace XMLUtils {
 
 class ZEBXmlCDATA : public ZEBXmlNode {
 public:
+    static constexpr int32_t kNodeKind = 4;
+    int32_t NodeKind() const override { return kNodeKind; }
     /// A section made in memory, status new.
     ZEBXmlCDATA();
     explicit ZEBXmlCDATA(ZEBXmlNode* owner);

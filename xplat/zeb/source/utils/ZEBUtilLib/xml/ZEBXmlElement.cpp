@@ -80,7 +80,7 @@ TOVRESULT ZEBXmlElement::Save(UTIL::ITOVXmlWriter* writer) {
         if (!writer) Throw(TOV_E_INVALIDARG);
         if (m_Status == kStatusDeleted) return TOV_OK;
         const ZEBString tag = GetTagName();
-        if (auto* parent = dynamic_cast<ZEBXmlElement*>(m_pOwner)) {
+        if (auto* parent = NodeAs<ZEBXmlElement>(m_pOwner)) {
             const ZEBString parentTag = parent->GetTagName();
             TOVCheck(writer->WriteElement(tag.InArg(), parentTag.InArg()));
         } else {
@@ -117,13 +117,19 @@ TOVRESULT ZEBXmlElement::SetTagName(const ZEBString& tag) {
 
 ZEBString ZEBXmlElement::GetText() {
     TOVCheck(Load());
-    ZEBString text = EmptyText();
     std::vector<ZEBXmlText*> pieces;
     TOVCheck(GetAllTexts(pieces));
+    std::vector<ZEBString> parts;
     for (const ZEBXmlText* piece : pieces) {
-        const ZEBString part = piece->GetText();
-        if (!part.IsEmpty()) text += part;
+        ZEBString part = piece->GetText();
+        if (!part.IsEmpty()) parts.push_back(std::move(part));
     }
+    // The result is UTF-16 in every case; a single piece, the common one, is
+    // converted once instead of appended to an empty text.
+    if (parts.empty()) return EmptyText();
+    if (parts.size() == 1) return ZEBString(kTOVUnicodeUTF16, parts.front().InArg());
+    ZEBString text = EmptyText();
+    for (const ZEBString& part : parts) text += part;
     return text;
 }
 
@@ -132,7 +138,7 @@ TOVRESULT ZEBXmlElement::SetText(const ZEBString& text) {
         TOVCheck(Load());
         std::vector<ZEBXmlNode*> kept;
         for (ZEBXmlNode* child : m_Children) {
-            if (auto* piece = dynamic_cast<ZEBXmlText*>(child)) {
+            if (auto* piece = NodeAs<ZEBXmlText>(child)) {
                 if (piece->IsNew()) {
                     delete piece;
                     continue;
@@ -161,7 +167,7 @@ TOVRESULT ZEBXmlElement::CollectChildren(std::vector<Kind*>& out) {
     return TOVGuarded([&] {
         TOVCheck(Load());
         for (ZEBXmlNode* child : m_Children) {
-            if (auto* match = dynamic_cast<Kind*>(child)) out.push_back(match);
+            if (auto* match = NodeAs<Kind>(child)) out.push_back(match);
         }
         return TOV_OK;
     });
@@ -179,7 +185,7 @@ TOVRESULT ZEBXmlElement::GetAllNonAttrChildren(std::vector<ZEBXmlNode*>& out) {
     return TOVGuarded([&] {
         TOVCheck(Load());
         for (ZEBXmlNode* child : m_Children) {
-            if (!dynamic_cast<ZEBXmlAttribute*>(child)) out.push_back(child);
+            if (!NodeAs<ZEBXmlAttribute>(child)) out.push_back(child);
         }
         return TOV_OK;
     });
@@ -195,7 +201,7 @@ ZEBXmlAttribute* ZEBXmlElement::GetAttributeNode(const ZEBString& name) {
     if (found == m_AttributeIndex.end()) return nullptr;
     const int32_t position = found->second;
     if (position < 0 || static_cast<size_t>(position) >= m_Children.size()) return nullptr;
-    auto* attribute = dynamic_cast<ZEBXmlAttribute*>(m_Children[position]);
+    auto* attribute = NodeAs<ZEBXmlAttribute>(m_Children[position]);
     if (!attribute || attribute->GetStatus() == kStatusDeleted) return nullptr;
     return attribute;
 }
@@ -216,7 +222,7 @@ TOVRESULT ZEBXmlElement::SetAttribute(const ZEBString& name, const ZEBString& va
             const int32_t position = found->second;
             ZEBXmlAttribute* attribute = nullptr;
             if (position >= 0 && static_cast<size_t>(position) < m_Children.size()) {
-                attribute = dynamic_cast<ZEBXmlAttribute*>(m_Children[position]);
+                attribute = NodeAs<ZEBXmlAttribute>(m_Children[position]);
             }
             if (!attribute) Throw(TOV_E_UNEXPECTED);
             TOVCheck(attribute->SetValue(value));
@@ -238,7 +244,7 @@ TOVRESULT ZEBXmlElement::DeleteAttribute(const ZEBString& name) {
         RefreshAttributeIndex();
         if (m_AttributeIndex.empty()) Throw(ZEB_E_NOTFOUND);
         for (ZEBXmlNode* child : m_Children) {
-            auto* attribute = dynamic_cast<ZEBXmlAttribute*>(child);
+            auto* attribute = NodeAs<ZEBXmlAttribute>(child);
             if (attribute && attribute->GetStatus() != kStatusDeleted && attribute->GetName() == name) {
                 TOVCheck(attribute->Delete());
             }
@@ -252,7 +258,7 @@ void ZEBXmlElement::RefreshAttributeIndex() {
     if (m_Status == kStatusNotLoaded) Throw(ZEB_E_NOTREADY);
     m_AttributeIndex.clear();
     for (size_t position = 0; position < m_Children.size(); ++position) {
-        const auto* attribute = dynamic_cast<const ZEBXmlAttribute*>(m_Children[position]);
+        const auto* attribute = NodeAs<ZEBXmlAttribute>(m_Children[position]);
         if (!attribute || attribute->GetStatus() == kStatusDeleted) continue;
         // emplace keeps the first of two attributes of one name.
         m_AttributeIndex.emplace(IndexKey(attribute->GetName()), static_cast<int32_t>(position));
@@ -288,14 +294,24 @@ int ZEBXmlElement::IsMatched(const _ZEBXMLELEMPAIR* pairs, unsigned int count, i
     return 0;
 }
 
+const std::string& ZEBXmlElement::TagKey() {
+    if (IsNew() || !m_HasTagKey) {
+        m_TagKey = IndexKey(GetTagName());
+        m_HasTagKey = !IsNew();
+    }
+    return m_TagKey;
+}
+
 void ZEBXmlElement::VisitElements(const ZEBString& name, const Filter& filter,
                                   const std::function<bool(ZEBXmlElement*)>& visit) {
     TOVCheck(Load());
     const bool everyTag = name.IsEmpty() != 0;
+    // Tags compare exactly, code point by code point: as UTF-8 bytes.
+    const std::string wanted = everyTag ? std::string() : IndexKey(name);
     for (size_t i = 0; i < m_Children.size(); ++i) {
-        auto* element = dynamic_cast<ZEBXmlElement*>(m_Children[i]);
+        auto* element = NodeAs<ZEBXmlElement>(m_Children[i]);
         if (!element) continue;
-        if (!everyTag && element->GetTagName() != name) continue;
+        if (!everyTag && element->TagKey() != wanted) continue;
         if (filter && !filter(*element)) continue;
         if (!visit(element)) return;
     }

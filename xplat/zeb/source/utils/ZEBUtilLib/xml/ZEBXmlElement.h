@@ -26,6 +26,8 @@ class ZEBXmlText;
 
 class ZEBXmlElement : public ZEBXmlNode {
 public:
+    static constexpr int32_t kNodeKind = 1;
+    int32_t NodeKind() const override { return kNodeKind; }
     /// An element made in memory, status new, with no tag yet.
     ZEBXmlElement();
     explicit ZEBXmlElement(ZEBXmlNode* owner);
@@ -117,8 +119,16 @@ public:
     TOVRESULT AddElement(const ZEBString& name, ZEBXmlElement** added);
     TOVRESULT AddElement(const ZEBString& name, const ZEBString& text, ZEBXmlElement** added);
 
+protected:
+    void DomChanged() override { m_HasTagKey = false; }
+
 private:
     using Filter = std::function<bool(ZEBXmlElement&)>;
+
+    /// The tag as UTF-8, to match tags without a trip through the host's
+    /// strings for every child. A bound element's tag never changes, so it is
+    /// fetched once per DOM node.
+    const std::string& TagKey();
 
     /// Loads, then calls `visit` for each child element whose tag matches
     /// `name` and that passes `filter`, until `visit` returns false.
@@ -136,6 +146,8 @@ private:
 
     /// Attribute name in UTF-8 to its position among the children.
     std::map<std::string, int32_t> m_AttributeIndex;
+    std::string m_TagKey;
+    bool m_HasTagKey = false;
     /// Used only by an element made in memory.
     ZEBString m_TagName;
 };

@@ -85,6 +85,7 @@ TOVRESULT ZEBXmlNode::CopyTo(ZEBXmlNode& target) const {
         target.Clear();
         target.m_pDom = m_pDom;
         if (m_pDom) m_pDom->AddRef();
+        target.DomChanged();
         target.m_pOwner = m_pOwner;
         target.m_Origin = m_Origin;
         target.m_Status = m_Status;
@@ -105,6 +106,7 @@ void ZEBXmlNode::Clear() {
     if (m_pDom) {
         m_pDom->Release();
         m_pDom = nullptr;
+        DomChanged();
     }
     m_Status = kStatusNotLoaded;
     DeleteChildren();
@@ -261,6 +263,7 @@ ZEBXmlNode& ZEBXmlNode::operator=(UTIL::ITOVXmlDomNode* dom) {
     Clear();
     m_pDom = dom;
     if (m_pDom) m_pDom->AddRef();
+    DomChanged();
     m_Status = kStatusNotLoaded;
     return *this;
 }
@@ -293,7 +296,7 @@ ZEBXmlNode* ZEBXmlNode::ChildHolding(UTIL::ITOVXmlDomNode* dom, bool strict) con
 }
 
 ZEBXmlElement& ZEBXmlNode::OwningElement() const {
-    auto* element = dynamic_cast<ZEBXmlElement*>(m_pOwner);
+    auto* element = NodeAs<ZEBXmlElement>(m_pOwner);
     if (!element) Throw(ZEB_E_NOTREADY);
     return *element;
 }

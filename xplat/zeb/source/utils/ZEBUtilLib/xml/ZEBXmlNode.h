@@ -75,6 +75,14 @@ public:
     /// The DOM's name and value; a null string from the DOM gives the empty string.
     virtual ZEBString GetName() const;
     virtual ZEBString GetValue() const;
+    /// Called whenever the node is bound to another DOM node (or to none), so
+    /// that a subclass can drop what it cached of the former one.
+    virtual void DomChanged() {}
+
+public:
+    /// The node's type number (1 element, 2 attribute, 3 text, 4 CDATA),
+    /// known without asking the DOM.
+    virtual int32_t NodeKind() const = 0;
 
     /// A new empty wrapper made in memory, of the class for `dom`'s type, not
     /// bound to it; null for an unknown type. A null `dom` throws TOV_E_INVALIDARG.
@@ -139,6 +147,17 @@ private:
     /// Binds `dom` and adds the wrapper as a child; unknown types are skipped.
     void AddBoundChild(UTIL::ITOVXmlDomNode* dom);
 };
+
+/// `node` as a `T` when it is one, else null: a check of the node's kind,
+/// cheaper than a dynamic_cast on the paths that walk every child.
+template <class T>
+T* NodeAs(ZEBXmlNode* node) {
+    return node && node->NodeKind() == T::kNodeKind ? static_cast<T*>(node) : nullptr;
+}
+template <class T>
+const T* NodeAs(const ZEBXmlNode* node) {
+    return node && node->NodeKind() == T::kNodeKind ? static_cast<const T*>(node) : nullptr;
+}
 
 }  // namespace XMLUtils
 }  // namespace ZEB

@@ -8,6 +8,8 @@ namespace XMLUtils {
 
 class ZEBXmlText : public ZEBXmlNode {
 public:
+    static constexpr int32_t kNodeKind = 3;
+    int32_t NodeKind() const override { return kNodeKind; }
     /// Text made in memory, status new.
     ZEBXmlText();
     explicit ZEBXmlText(const ZEBString& text);
