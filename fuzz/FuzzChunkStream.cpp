@@ -11,8 +11,7 @@
 #include <string>
 
 #include "reader/OrloStream.h"
-#include "startup/ZEBUtilLib.h"
-#include "tov/host/TOVHost.h"
+#include "FuzzHost.h"
 
 namespace {
 
@@ -38,12 +37,8 @@ void Ask(Get get) {
 }  // namespace
 
 extern "C" int LLVMFuzzerInitialize(int*, char***) {
-    // The reader logs through the utility library, which needs a host; lines
-    // are formatted at every level and dropped.
-    static TOVPtr<TOVHost> host = TOVHost::Create();
-    host->Console().SetVerbosity(~0u);
-    host->Console().SetSink([](uint32_t, const std::string&) {});
-    if (ZEB::ZEBInitialize(host.Get()) < 0) std::abort();
+    // The reader logs through the utility library, which needs a host.
+    StartFuzzHost();
     g_memoryFile = memfd_create("orlo-fuzz", 0);
     if (g_memoryFile < 0) std::abort();
     g_path = "/proc/self/fd/" + std::to_string(g_memoryFile);

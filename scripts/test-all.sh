@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs what is missing, builds, and runs every test: once in a plain
 # build, once more under AddressSanitizer and UndefinedBehaviorSanitizer; then
-# runs the fuzzer for a minute.
+# runs the fuzzers for a minute and a half.
 set -euo pipefail
 root=$(cd "$(dirname "$0")/.." && pwd)
 bash "$root/scripts/install-deps.sh"
@@ -13,5 +13,7 @@ bash "$root/scripts/build.sh" build-asan -DORLO_SANITIZE=ON -DORLO_BENCH=OFF -DC
 ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
     ctest --test-dir "$root/build-asan" --output-on-failure -j "$(nproc)"
 
-# The chunk-walk fuzzer, built with clang, for one minute under AddressSanitizer.
-bash "$root/scripts/fuzz.sh" 60
+# The fuzzers, built with clang, under AddressSanitizer: the chunk walk for a
+# minute, the iXML text for half a minute.
+bash "$root/scripts/fuzz.sh" 60 fuzz_chunk_stream
+bash "$root/scripts/fuzz.sh" 30 fuzz_ixml
