@@ -1,6 +1,5 @@
 // `orlo chunks` run as a person runs it: output, nulls and exit status.
 #include <gtest/gtest.h>
-#include <sys/wait.h>
 
 #include <cstdio>
 #include <nlohmann/json.hpp>
@@ -8,27 +7,13 @@
 #include "AudioFileWriter.h"
 #include "Bytes.h"
 #include "ChunkPayloads.h"
+#include "RunTool.h"
 #include "TempFile.h"
 
 namespace {
 
-struct Outcome {
-    int status;
-    std::string out;
-};
-
-Outcome RunOrlo(const std::string& arguments) {
-    const std::string command = std::string(ORLO_TOOL) + " -q " + arguments + " 2>/dev/null";
-    FILE* pipe = popen(command.c_str(), "r");
-    Outcome outcome{-1, ""};
-    if (!pipe) return outcome;
-    char buffer[4096];
-    size_t got;
-    while ((got = std::fread(buffer, 1, sizeof buffer, pipe)) > 0) outcome.out.append(buffer, got);
-    const int status = pclose(pipe);
-    outcome.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-    return outcome;
-}
+// `orlo -q ARGUMENTS`, as a person runs it.
+ToolOutcome RunOrlo(const std::string& arguments) { return RunTool(ORLO_TOOL, "-q " + arguments); }
 
 std::string BroadcastWave() {
     Payload::Bext bext;
@@ -45,7 +30,7 @@ std::string BroadcastWave() {
 
 TEST(ChunksCommandTest, GoodFileAsJson) {
     TempFile file(BroadcastWave());
-    const Outcome outcome = RunOrlo("chunks --json " + file.Path());
+    const ToolOutcome outcome = RunOrlo("chunks --json " + file.Path());
     ASSERT_EQ(outcome.status, 0) << outcome.out;
     const auto json = nlohmann::json::parse(outcome.out);
     EXPECT_TRUE(json["error"].is_null());
@@ -65,7 +50,7 @@ TEST(ChunksCommandTest, GoodFileAsJson) {
 
 TEST(ChunksCommandTest, FailedStreamGivesItsErrorAndNulls) {
     TempFile file(AudioFileWriter::Wave().Chunk("data", "").Bytes());
-    const Outcome outcome = RunOrlo("chunks --json " + file.Path());
+    const ToolOutcome outcome = RunOrlo("chunks --json " + file.Path());
     EXPECT_EQ(outcome.status, 1);
     const auto json = nlohmann::json::parse(outcome.out);
     EXPECT_EQ(json["error"], "Malformed WAVE file with 'DATA' before 'fmt '");
@@ -76,7 +61,7 @@ TEST(ChunksCommandTest, FailedStreamGivesItsErrorAndNulls) {
 
 TEST(ChunksCommandTest, GoodStreamWithoutDataHasNullSamples) {
     TempFile file(AudioFileWriter::Wave().Chunk("fmt ", Payload::FmtChunk(Payload::Fmt())).Bytes());
-    const Outcome outcome = RunOrlo("chunks --json " + file.Path());
+    const ToolOutcome outcome = RunOrlo("chunks --json " + file.Path());
     EXPECT_EQ(outcome.status, 0);
     const auto json = nlohmann::json::parse(outcome.out);
     EXPECT_EQ(json["channels"], 2);
@@ -85,7 +70,7 @@ TEST(ChunksCommandTest, GoodStreamWithoutDataHasNullSamples) {
 }
 
 TEST(ChunksCommandTest, TextNamesTheErrorAndUsageErrorsExit2) {
-    const Outcome missing = RunOrlo("chunks /nonexistent/take.wav");
+    const ToolOutcome missing = RunOrlo("chunks /nonexistent/take.wav");
     EXPECT_EQ(missing.status, 1);
     EXPECT_NE(missing.out.find("error: File could not be opened"), std::string::npos) << missing.out;
     EXPECT_EQ(RunOrlo("chunks").status, 2);

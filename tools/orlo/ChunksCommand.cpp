@@ -143,11 +143,7 @@ CLI::App* ChunksCommand::Declare(CLI::App& app) {
 
 int ChunksCommand::Run(const OrloOptions& options) {
     OrloSession session(options.Verbosity(), false);
-    if (session.StartResult() < 0) {
-        std::fprintf(stderr, "orlo: the host's services did not start (0x%08X)\n",
-                     static_cast<unsigned>(session.StartResult()));
-        return kExitFailed;
-    }
+    if (!session.Started()) return kExitFailed;
     const OrloStream stream(m_Path.c_str(), 255);
     const Json report = Report(m_Path, stream, &session.Host());
     if (m_Json) {

@@ -18,3 +18,9 @@ OrloSession::~OrloSession() {
     if (m_StartResult >= 0) ZEB::ZEBTerminate();
     m_Host->UnloadAllModules();
 }
+
+bool OrloSession::Started() const {
+    if (m_StartResult >= 0) return true;
+    std::fprintf(stderr, "orlo: the host's services did not start (0x%08X)\n", static_cast<unsigned>(m_StartResult));
+    return false;
+}

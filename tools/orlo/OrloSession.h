@@ -18,6 +18,8 @@ public:
 
     /// The result of starting the utility library.
     TOVRESULT StartResult() const { return m_StartResult; }
+    /// True when the host's services started; otherwise says so on stderr.
+    bool Started() const;
     TOVHost& Host() { return *m_Host; }
     const std::vector<std::string>& ConsoleLines() const { return m_Lines; }
 

@@ -15,11 +15,7 @@ CLI::App* VersionCommand::Declare(CLI::App& app) {
 
 int VersionCommand::Run(const OrloOptions& options) {
     OrloSession session(options.Verbosity(), false);
-    if (session.StartResult() < 0) {
-        std::fprintf(stderr, "orlo: the host's services did not start (0x%08X)\n",
-                     static_cast<unsigned>(session.StartResult()));
-        return kExitFailed;
-    }
+    if (!session.Started()) return kExitFailed;
     if (m_Json) {
         const nlohmann::json out = {{"tool", kOrloToolVersion}, {"plugin", OrloRegInfo::kVersionText}};
         std::printf("%s\n", out.dump(2).c_str());
