@@ -4,9 +4,12 @@
 
 #include <string>
 
+#include <libxml/parser.h>
+
 #include "TestHost.h"
 #include "reader/ParceRawIXML.h"
 #include "startup/ZEBUtilLib.h"
+#include "xml/ZEBXmlDoc.h"
 
 namespace {
 
@@ -57,6 +60,33 @@ void BM_ParceRawIXML(benchmark::State& state) {
     ZEB::ZEBTerminate();
 }
 BENCHMARK(BM_ParceRawIXML)->Unit(benchmark::kMicrosecond);
+
+// The parts of that cost: libxml2 alone, as the host's reader calls it...
+void BM_LibXml2Alone(benchmark::State& state) {
+    const std::string xml = TypicalIxml();
+    for (auto _ : state) {
+        xmlDocPtr doc = xmlReadMemory(xml.data(), static_cast<int>(xml.size()), nullptr, "UTF-8",
+                                      XML_PARSE_NONET | XML_PARSE_NOBLANKS);
+        benchmark::DoNotOptimize(doc);
+        xmlFreeDoc(doc);
+    }
+}
+BENCHMARK(BM_LibXml2Alone)->Unit(benchmark::kMicrosecond);
+
+// ...and the text handed over as a host string and parsed into a document,
+// before any element is read.
+void BM_DocumentLoad(benchmark::State& state) {
+    TestHost host;
+    ZEB::ZEBInitialize(host.Get());
+    const std::string xml = TypicalIxml();
+    for (auto _ : state) {
+        const ZEB::ZEBString text(reinterpret_cast<const unsigned char*>(xml.c_str()));
+        ZEB::XMLUtils::ZEBXmlDoc document(host.Get());
+        if (document.Load(text) != TOV_OK) state.SkipWithError("the document did not load");
+    }
+    ZEB::ZEBTerminate();
+}
+BENCHMARK(BM_DocumentLoad)->Unit(benchmark::kMicrosecond);
 
 }  // namespace
 
