@@ -226,15 +226,10 @@ enum _aafElectroSpatialFormulation_e : aafInt32 {
 };
 typedef _aafElectroSpatialFormulation_e aafElectroSpatialFormulation_t;
 
+/// Tape form factors are not written by this system; the other published
+/// values (1 to 7) pass through as numbers.
 enum _aafTapeCaseType_e : aafInt32 {
-    kAAFTapeCaseNull = 0,
-    kAAFThreeFourthInchVideoTape = 1,
-    kAAFVHSVideoTape = 2,
-    kAAF8mmVideoTape = 3,
-    kAAFBetacamVideoTape = 4,
-    kAAFCompactCassette = 5,
-    kAAFDATCartridge = 6,
-    kAAFNagraAudioTape = 7
+    kAAFTapeCaseNull = 0
 };
 typedef _aafTapeCaseType_e aafTapeCaseType_t;
 
