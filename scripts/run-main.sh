@@ -3,5 +3,5 @@
 set -euo pipefail
 root=$(cd "$(dirname "$0")/.." && pwd)
 bash "$root/scripts/install-deps.sh"
-bash "$root/scripts/build.sh" build -DORLO_TESTS=OFF -DORLO_BENCH=OFF
+bash "$root/scripts/build.sh" build -DORLO_TESTS=OFF -DORLO_BENCH=OFF -DORLO_SANITIZE=OFF -DCMAKE_BUILD_TYPE=RelWithDebInfo
 "$root/build/bin/orlo"

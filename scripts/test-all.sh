@@ -6,10 +6,11 @@ set -euo pipefail
 root=$(cd "$(dirname "$0")/.." && pwd)
 bash "$root/scripts/install-deps.sh"
 
-bash "$root/scripts/build.sh" build
+# Options are given in full: the main job configures the same tree without tests.
+bash "$root/scripts/build.sh" build -DORLO_TESTS=ON -DORLO_BENCH=ON -DORLO_SANITIZE=OFF -DCMAKE_BUILD_TYPE=RelWithDebInfo
 ctest --test-dir "$root/build" --output-on-failure -j "$(nproc)"
 
-bash "$root/scripts/build.sh" build-asan -DORLO_SANITIZE=ON -DORLO_BENCH=OFF -DCMAKE_BUILD_TYPE=Debug
+bash "$root/scripts/build.sh" build-asan -DORLO_TESTS=ON -DORLO_SANITIZE=ON -DORLO_BENCH=OFF -DCMAKE_BUILD_TYPE=Debug
 ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
     ctest --test-dir "$root/build-asan" --output-on-failure -j "$(nproc)"
 
