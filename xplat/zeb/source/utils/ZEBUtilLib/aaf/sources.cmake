@@ -7,5 +7,6 @@ target_sources(ZEBUtilLib PRIVATE
 target_link_libraries(ZEBUtilLib PUBLIC ${CMAKE_DL_LIBS})
 target_sources(ZEBUtilLib PRIVATE
     ${CMAKE_CURRENT_LIST_DIR}/AAFDescriptorExtensions.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/AAFImageGeometry.cpp
     ${CMAKE_CURRENT_LIST_DIR}/AAFTreeReader.cpp
     ${CMAKE_CURRENT_LIST_DIR}/dumpAAF.cpp)
