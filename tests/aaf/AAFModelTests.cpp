@@ -264,6 +264,56 @@ TEST_F(AAFModel, AttributesAppendThroughAnOptionalStrongReferenceVector) {
     EXPECT_EQ(count, 1u);
 }
 
+TEST_F(AAFModel, PictureDescriptorsComeFromACallersConcreteClass) {
+    const aafUID_t pictureId = {0x7E57C1A5, 1, 2, {3, 4, 5, 6, 7, 8, 9, 10}};
+    Ptr<IAAFDigitalImageDescriptor> abstract;
+    EXPECT_EQ(f.dictionary->CreateInstance(kAAFClassID_DigitalImageDescriptor, IID_IAAFDigitalImageDescriptor,
+                                           abstract.outUnknown()),
+              AAFRESULT_INVALID_PARAM);
+
+    Ptr<IAAFClassDef> parent, cls;
+    ASSERT_EQ(f.dictionary->LookupClassDef(kAAFClassID_DigitalImageDescriptor, parent.out()), AAFRESULT_SUCCESS);
+    ASSERT_EQ(f.dictionary->CreateMetaInstance(kAAFClassID_ClassDefinition, IID_IAAFClassDef, cls.outUnknown()),
+              AAFRESULT_SUCCESS);
+    Ptr<IUnknown> early;
+    EXPECT_EQ(cls->CreateInstance(IID_IUnknown, early.out()), AAFRESULT_NOT_INITIALIZED);
+    EXPECT_EQ(f.dictionary->RegisterClassDef(cls.get()), AAFRESULT_NOT_INITIALIZED);
+    ASSERT_EQ(cls->Initialize(pictureId, parent.get(), L"Picture", kAAFTrue), AAFRESULT_SUCCESS);
+    EXPECT_EQ(cls->Initialize(pictureId, parent.get(), L"Picture", kAAFTrue), AAFRESULT_ALREADY_INITIALIZED);
+    ASSERT_EQ(f.dictionary->RegisterClassDef(cls.get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(f.dictionary->RegisterClassDef(cls.get()), AAFRESULT_TABLE_DUP_KEY);
+
+    auto picture = f.Create<IAAFDigitalImageDescriptor>(pictureId);
+    ASSERT_TRUE(picture);
+    EXPECT_TRUE(Query<IAAFFileDescriptor>(picture.get()));
+    EXPECT_FALSE(Query<IAAFSoundDescriptor>(picture.get()));
+    EXPECT_FALSE(Query<IAAFDigitalImageDescriptor>(f.Create<IAAFObject>(kAAFClassID_PCMDescriptor).get()));
+
+    aafUInt32 height = 7, width = 7;
+    EXPECT_EQ(picture->GetStoredView(&height, &width), AAFRESULT_PROP_NOT_PRESENT);
+    EXPECT_EQ(height, 7u);
+    ASSERT_EQ(picture->SetStoredView(1080, 1920), AAFRESULT_SUCCESS);
+    ASSERT_EQ(picture->GetStoredView(&height, &width), AAFRESULT_SUCCESS);
+    EXPECT_EQ(height, 1080u);
+    EXPECT_EQ(width, 1920u);
+    EXPECT_EQ(picture->GetStoredView(nullptr, &width), AAFRESULT_NULL_PARAM);
+    aafRational_t aspect{};
+    EXPECT_EQ(picture->GetImageAspectRatio(&aspect), AAFRESULT_PROP_NOT_PRESENT);
+    ASSERT_EQ(picture->SetImageAspectRatio({16, 9}), AAFRESULT_SUCCESS);
+    ASSERT_EQ(picture->GetImageAspectRatio(&aspect), AAFRESULT_SUCCESS);
+    EXPECT_EQ(aspect.numerator, 16);
+    EXPECT_EQ(aspect.denominator, 9);
+    aafUInt32 alignment = 0;
+    ASSERT_EQ(picture->SetImageAlignmentFactor(4096), AAFRESULT_SUCCESS);
+    ASSERT_EQ(picture->GetImageAlignmentFactor(&alignment), AAFRESULT_SUCCESS);
+    EXPECT_EQ(alignment, 4096u);
+    aafUID_t compression{}, gamma{};
+    EXPECT_EQ(picture->GetCompression(&compression), AAFRESULT_PROP_NOT_PRESENT);
+    ASSERT_EQ(picture->SetGamma(pictureId), AAFRESULT_SUCCESS);
+    ASSERT_EQ(picture->GetGamma(&gamma), AAFRESULT_SUCCESS);
+    EXPECT_EQ(gamma, pictureId);
+}
+
 TEST(AAFLibrary, ResultTextsAndVersion) {
     aafProductVersion_t version{};
     EXPECT_EQ(AAFGetLibraryVersion(&version), AAFRESULT_SUCCESS);

@@ -86,3 +86,5 @@ inline constexpr aafUID_t kAAFClassID_DefinitionObject = {0x4F524C4F, 0x0001, 0x
 inline constexpr aafUID_t AUID_AAFDefinitionObject = kAAFClassID_DefinitionObject;
 inline constexpr aafUID_t kAAFClassID_DataDefinition = {0x4F524C4F, 0x0001, 0x0003, {0x8F, 0x1C, 0x5A, 0x3E, 0x4F, 0x52, 0x4C, 0x4F}};
 inline constexpr aafUID_t AUID_AAFDataDefinition = kAAFClassID_DataDefinition;
+inline constexpr aafUID_t kAAFClassID_ClassDefinition = {0x4F524C4F, 0x0001, 0x0004, {0x8F, 0x1C, 0x5A, 0x3E, 0x4F, 0x52, 0x4C, 0x4F}};
+inline constexpr aafUID_t AUID_AAFClassDefinition = kAAFClassID_ClassDefinition;

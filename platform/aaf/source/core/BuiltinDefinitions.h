@@ -43,6 +43,8 @@ struct BuiltinDefinitions {
         PropertyDefinition *essenceLocator, *fileSampleRate, *fileLength;
         PropertyDefinition *soundAudioSamplingRate, *soundLocked, *soundElectroSpatial, *soundChannels,
             *soundQuantizationBits, *soundCompression, *pcmBlockAlign, *pcmAverageBPS;
+        PropertyDefinition *imageCompression, *imageStoredHeight, *imageStoredWidth, *imageAspectRatio, *imageGamma,
+            *imageAlignmentFactor;
         PropertyDefinition *multipleFileDescriptors, *waveSummary, *aifcSummary;
         PropertyDefinition *tapeManufacturerID, *tapeModel, *tapeLength, *networkURLString;
     } p{};

@@ -44,6 +44,7 @@
 #include "../views/SegmentView.h"
 #include "../views/SequenceView.h"
 #include "../views/SoundDescriptorView.h"
+#include "../views/DigitalImageDescriptorView.h"
 #include "../views/SourceClipView.h"
 #include "../views/SourceMobView.h"
 #include "../views/SourceReferenceView.h"
@@ -272,6 +273,7 @@ private:
         c.essenceDescriptor->AddView(MakerOf<EssenceDescriptorView>());
         c.fileDescriptor->AddView(MakerOf<FileDescriptorView>());
         c.soundDescriptor->AddView(MakerOf<SoundDescriptorView>());
+        c.digitalImageDescriptor->AddView(MakerOf<DigitalImageDescriptorView>());
         c.pcmDescriptor->AddView(MakerOf<PCMDescriptorView>());
         c.multipleDescriptor->AddView(MakerOf<MultipleDescriptorView>());
         c.tapeDescriptor->AddView(MakerOf<TapeDescriptorView>());
@@ -406,6 +408,17 @@ private:
                                        L"QuantizationBits", t.uint32, false);
         p.soundCompression =
             Prop(c.soundDescriptor, kAAFPropID_SoundDescriptor_Compression, L"Compression", t.auid, true);
+        p.imageCompression = Prop(c.digitalImageDescriptor, kAAFPropID_DigitalImageDescriptor_Compression,
+                                  L"Compression", t.auid, true);
+        p.imageStoredHeight = Prop(c.digitalImageDescriptor, kAAFPropID_DigitalImageDescriptor_StoredHeight,
+                                   L"StoredHeight", t.uint32, false);
+        p.imageStoredWidth = Prop(c.digitalImageDescriptor, kAAFPropID_DigitalImageDescriptor_StoredWidth,
+                                  L"StoredWidth", t.uint32, false);
+        p.imageAspectRatio = Prop(c.digitalImageDescriptor, kAAFPropID_DigitalImageDescriptor_ImageAspectRatio,
+                                  L"ImageAspectRatio", t.rational, false);
+        p.imageGamma = Prop(c.digitalImageDescriptor, kAAFPropID_DigitalImageDescriptor_Gamma, L"Gamma", t.auid, true);
+        p.imageAlignmentFactor = Prop(c.digitalImageDescriptor, kAAFPropID_DigitalImageDescriptor_ImageAlignmentFactor,
+                                      L"ImageAlignmentFactor", t.uint32, true);
         p.pcmBlockAlign = Prop(c.pcmDescriptor, kAAFPropID_PCMDescriptor_BlockAlign, L"BlockAlign", t.uint16, false);
         p.pcmAverageBPS = Prop(c.pcmDescriptor, kAAFPropID_PCMDescriptor_AverageBPS, L"AverageBPS", t.uint32, false);
         p.waveSummary = Prop(c.waveDescriptor, kAAFPropID_WAVEDescriptor_Summary, L"Summary", t.uint8Array, false);

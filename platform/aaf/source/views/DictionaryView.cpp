@@ -42,6 +42,12 @@ AAFRESULT DictionaryView::CreateMetaInstance(aafUID_constref id, REFIID riid, IU
         Require(ppMetaDefinition);
         *ppMetaDefinition = nullptr;
         Schema& schema = m_object.GetSchema();
+        // A caller's own class: IAAFClassDef::Initialize names it and its parent.
+        if (id == kAAFClassID_ClassDefinition) {
+            ClassDefinition* cls =
+                schema.Own(std::make_unique<ClassDefinition>(schema, id, std::wstring(), nullptr, false));
+            return cls->QueryInterface(riid, reinterpret_cast<void**>(ppMetaDefinition));
+        }
         if (id != kAAFClassID_TypeDefinitionRecord) throw static_cast<int>(AAFRESULT_NOT_IMPLEMENTED);
         auto* record = static_cast<TypeDefRecordType*>(
             schema.Own(std::make_unique<TypeDefRecordType>(schema, id, std::wstring())));

@@ -1,6 +1,7 @@
 #pragma once
 /// Small helpers that the views share: arguments checked and turned into the
 /// library's own objects, new objects, strings in and out, the clock.
+#include "../core/BuiltinDefinitions.h"
 #include "../core/ClassDefinition.h"
 #include "../core/DataDefinition.h"
 #include "../core/Guard.h"
@@ -32,6 +33,23 @@ template <class I>
 AAFRESULT HandOut(ModelObject& object, I** out) {
     Require(out);
     return object.QueryInterface(AAFInterfaceID<I>::value, reinterpret_cast<void**>(out));
+}
+/// Sets a fixed-size built-in property of `object`.
+template <class T>
+AAFRESULT SetBuiltin(ModelObject& object, PropertyDefinition* BuiltinDefinitions::Properties::*prop, const T& v) {
+    return Guarded([&] {
+        object.SetFixed(*(Builtins(object).p.*prop), v);
+        return AAFRESULT_SUCCESS;
+    });
+}
+/// Reads a fixed-size built-in property of `object`; AAFRESULT_PROP_NOT_PRESENT when absent.
+template <class T>
+AAFRESULT GetBuiltin(ModelObject& object, PropertyDefinition* BuiltinDefinitions::Properties::*prop, T* out) {
+    return Guarded([&] {
+        Require(out);
+        *out = object.GetRequired<T>(*(Builtins(object).p.*prop));
+        return AAFRESULT_SUCCESS;
+    });
 }
 /// Copies a string property into a caller's buffer; AAFRESULT_PROP_NOT_PRESENT when absent.
 void CopyStringProperty(const ModelObject& object, const PropertyDefinition& def, aafCharacter* buffer,
