@@ -18,20 +18,39 @@ class AAFDescriptorExtensions : public ::testing::Test {
 protected:
     TransientFile f{&AAFFileOpenTransient};
 
-    aafUID_t ReadUID(IUnknown* object, const aafUID_t& classId, const aafUID_t& propertyId) {
+    Ptr<IAAFPropertyValue> ReadValue(IUnknown* object, const aafUID_t& classId, const aafUID_t& propertyId) {
         Ptr<IAAFClassDef> cls;
         EXPECT_EQ(f.dictionary->LookupClassDef(classId, cls.out()), AAFRESULT_SUCCESS);
         Ptr<IAAFPropertyDef> property;
         EXPECT_EQ(cls->LookupPropertyDef(propertyId, property.out()), AAFRESULT_SUCCESS);
         Ptr<IAAFPropertyValue> value;
         EXPECT_EQ(Query<IAAFObject>(object)->GetPropertyValue(property.get(), value.out()), AAFRESULT_SUCCESS);
+        return value;
+    }
+
+    /// A record property of `object` as its C struct.
+    template <class T>
+    T ReadRecord(IUnknown* object, const aafUID_t& classId, const aafUID_t& propertyId, const aafUID_t& typeId) {
+        auto value = ReadValue(object, classId, propertyId);
         Ptr<IAAFTypeDef> type;
-        f.dictionary->LookupTypeDef(kAAFTypeID_AUID, type.out());
-        aafUID_t id{};
-        EXPECT_EQ(Query<IAAFTypeDefRecord>(type.get())->GetStruct(value.get(), reinterpret_cast<aafMemPtr_t>(&id),
-                                                                    sizeof id),
+        f.dictionary->LookupTypeDef(typeId, type.out());
+        T out{};
+        EXPECT_EQ(Query<IAAFTypeDefRecord>(type.get())->GetStruct(value.get(), reinterpret_cast<aafMemPtr_t>(&out),
+                                                                    sizeof out),
                   AAFRESULT_SUCCESS);
-        return id;
+        return out;
+    }
+
+    aafUID_t ReadUID(IUnknown* object, const aafUID_t& classId, const aafUID_t& propertyId) {
+        return ReadRecord<aafUID_t>(object, classId, propertyId, kAAFTypeID_AUID);
+    }
+
+    /// An instance of a concrete picture class registered for the test (once
+    /// per file): the published model keeps DigitalImageDescriptor abstract.
+    Ptr<IAAFDigitalImageDescriptor> NewPicture() {
+        const aafUID_t pictureId = {0x7E57C1A5, 1, 2, {3, 4, 5, 6, 7, 8, 9, 10}};
+        EXPECT_TRUE(f.RegisterConcreteClass(pictureId, kAAFClassID_DigitalImageDescriptor, L"Picture"));
+        return f.Create<IAAFDigitalImageDescriptor>(pictureId);
     }
 };
 
@@ -100,34 +119,77 @@ TEST_F(AAFDescriptorExtensions, ClassIDOfObjectsButNotOfTheDictionary) {
     }
 }
 
-TEST_F(AAFDescriptorExtensions, BoundsBoxTypeIsRegisteredOncePerDictionary) {
+bool SameRational(const _aafRational_t& a, const _aafRational_t& b) {
+    return a.numerator == b.numerator && a.denominator == b.denominator;
+}
+
+bool SameBox(const aafBoundsBox_t& a, const aafBoundsBox_t& b) {
+    return SameRational(a.PositionX, b.PositionX) && SameRational(a.PositionY, b.PositionY) &&
+           SameRational(a.Width, b.Width) && SameRational(a.Height, b.Height);
+}
+
+TEST_F(AAFDescriptorExtensions, BoxesAreSetOnAPictureAndTheirTypeRegisteredOnce) {
+    auto picture = NewPicture();
+    ASSERT_TRUE(picture);
     aafUInt32 before = 0, after = 0;
     f.dictionary->CountTypeDefs(&before);
-    aafBoundsBox_t box = ToAAFBox({0, 1}, {0, 1}, {1920, 1}, {1080, 1});
-    // No image descriptor is at hand: each call registers what it needs,
-    // then stops at the missing descriptor.
-    EXPECT_EQ(PutBoxesToAAF(f.dictionary.get(), nullptr, box, box, box), TOV_E_POINTER);
-    EXPECT_EQ(PutBoxesToAAF(f.dictionary.get(), nullptr, box, box, box), TOV_E_POINTER);
+    aafBoundsBox_t essence = ToAAFBox({0, 1}, {0, 1}, {1920, 1}, {1080, 1});
+    aafBoundsBox_t source = ToAAFBox({-40, 1}, {-10, 1}, {2000, 1}, {1100, 1});
+    aafBoundsBox_t valid = ToAAFBox({19, 2}, {0, 1}, {1901, 1}, {1080, 1});
+    // The second call finds the type and the properties, and its values stand.
+    EXPECT_EQ(PutBoxesToAAF(f.dictionary.get(), picture.get(), valid, valid, valid), TOV_OK);
+    EXPECT_EQ(PutBoxesToAAF(f.dictionary.get(), picture.get(), essence, source, valid), TOV_OK);
     f.dictionary->CountTypeDefs(&after);
     EXPECT_EQ(after, before + 1);
+    const struct {
+        aafUID_t property;
+        const aafBoundsBox_t& expected;
+    } boxes[] = {{kAAFPropID_EssenceBox, essence}, {kAAFPropID_SourceBox, source}, {kAAFPropID_ValidBox, valid}};
+    for (const auto& box : boxes)
+        EXPECT_TRUE(SameBox(ReadRecord<aafBoundsBox_t>(picture.get(), kAAFClassID_DigitalImageDescriptor,
+                                                       box.property, kAAFTypeID_OrrinBoundsBox),
+                            box.expected));
     Ptr<IAAFTypeDef> type;
     ASSERT_EQ(f.dictionary->LookupTypeDef(kAAFTypeID_OrrinBoundsBox, type.out()), AAFRESULT_SUCCESS);
-    auto record = Query<IAAFTypeDefRecord>(type.get());
-    Ptr<IAAFPropertyValue> value;
-    ASSERT_EQ(record->CreateValueFromStruct(reinterpret_cast<aafMemPtr_t>(&box), sizeof box, value.out()),
-              AAFRESULT_SUCCESS);
-    Ptr<IAAFPropertyValue> width;
-    ASSERT_EQ(record->GetValue(value.get(), 2, width.out()), AAFRESULT_SUCCESS);
     aafCharacter name[16];
-    ASSERT_EQ(record->GetMemberName(2, name, sizeof name), AAFRESULT_SUCCESS);
+    ASSERT_EQ(Query<IAAFTypeDefRecord>(type.get())->GetMemberName(2, name, sizeof name), AAFRESULT_SUCCESS);
     EXPECT_EQ(std::wstring(name), L"Width");
-    Ptr<IAAFTypeDef> rationalType;
-    f.dictionary->LookupTypeDef(kAAFTypeID_Rational, rationalType.out());
-    aafRational_t w{};
-    ASSERT_EQ(Query<IAAFTypeDefRecord>(rationalType.get())
-                  ->GetStruct(width.get(), reinterpret_cast<aafMemPtr_t>(&w), sizeof w),
-              AAFRESULT_SUCCESS);
-    EXPECT_EQ(w.numerator, 1920);
+    EXPECT_EQ(PutBoxesToAAF(f.dictionary.get(), nullptr, essence, source, valid), TOV_E_POINTER);
+}
+
+TEST_F(AAFDescriptorExtensions, BufferFillOrderTakesKnownDirectionsOnly) {
+    auto picture = NewPicture();
+    ASSERT_TRUE(picture);
+    const struct {
+        int order;
+        TOVRESULT result;
+        aafInt64 stored;  // what the descriptor holds after the call
+    } cases[] = {
+        {0, TOV_OK, 0}, {7, TOV_OK, 7}, {8, AAFRESULT_ILLEGAL_VALUE, 7}, {-1, AAFRESULT_ILLEGAL_VALUE, 7}, {2, TOV_OK, 2},
+    };
+    Ptr<IAAFTypeDef> type;
+    f.dictionary->LookupTypeDef(kAAFTypeID_ScanningDirectionType, type.out());
+    for (const auto& c : cases) {
+        EXPECT_EQ(SetBufferFillOrder(f.dictionary.get(), picture.get(), c.order), c.result) << c.order;
+        auto value = ReadValue(picture.get(), kAAFClassID_DigitalImageDescriptor,
+                               kAAFPropID_DigitalImageDescriptor_BufferFillOrder);
+        aafInt64 stored = -1;
+        EXPECT_EQ(Query<IAAFTypeDefEnum>(type.get())->GetIntegerValue(value.get(), &stored), AAFRESULT_SUCCESS);
+        EXPECT_EQ(stored, c.stored) << c.order;
+    }
+}
+
+TEST_F(AAFDescriptorExtensions, ImageRotationLastValueStands) {
+    auto picture = NewPicture();
+    ASSERT_TRUE(picture);
+    for (const aafRational_t rotation : {aafRational_t{90, 1}, aafRational_t{-1, 2}}) {
+        ASSERT_EQ(SetImageRotation(f.dictionary.get(), picture.get(), rotation), TOV_OK);
+        EXPECT_TRUE(SameRational(ReadRecord<aafRational_t>(picture.get(), kAAFClassID_DigitalImageDescriptor,
+                                                           kAAFPropID_DigitalImageDescriptor_ImageRotation,
+                                                           kAAFTypeID_Rational),
+                                 rotation));
+    }
+    EXPECT_EQ(SetImageRotation(f.dictionary.get(), nullptr, {90, 1}), TOV_E_POINTER);
 }
 
 }  // namespace

@@ -27,4 +27,13 @@ Ptr<IAAFDataDef> TransientFile::DataDef(const aafUID_t& id) {
     return out;
 }
 
+bool TransientFile::RegisterConcreteClass(const aafUID_t& id, const aafUID_t& parentId, const wchar_t* name) {
+    Ptr<IAAFClassDef> parent, cls;
+    return AAFRESULT_SUCCEEDED(dictionary->LookupClassDef(parentId, parent.out())) &&
+           AAFRESULT_SUCCEEDED(dictionary->CreateMetaInstance(kAAFClassID_ClassDefinition, IID_IAAFClassDef,
+                                                              cls.outUnknown())) &&
+           AAFRESULT_SUCCEEDED(cls->Initialize(id, parent.get(), name, kAAFTrue)) &&
+           AAFRESULT_SUCCEEDED(dictionary->RegisterClassDef(cls.get()));
+}
+
 }  // namespace aaftest

@@ -60,6 +60,9 @@ struct TransientFile {
         return out;
     }
     Ptr<IAAFDataDef> DataDef(const aafUID_t& id);
+    /// Registers a concrete class `id` under `parentId` through the dictionary,
+    /// as a caller extends the model; false when any step fails.
+    bool RegisterConcreteClass(const aafUID_t& id, const aafUID_t& parentId, const wchar_t* name);
 };
 
 }  // namespace aaftest
