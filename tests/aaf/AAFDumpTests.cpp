@@ -58,7 +58,9 @@ INSTANTIATE_TEST_SUITE_P(
     ::testing::Values(GoldenCase{"StereoText", &BuildStereoClip, ZEB::AAFDumpOptions::Format::Text, "stereo_clip.txt"},
                       GoldenCase{"StereoJSON", &BuildStereoClip, ZEB::AAFDumpOptions::Format::JSON, "stereo_clip.json"},
                       GoldenCase{"GroupedText", &Grouped125, ZEB::AAFDumpOptions::Format::Text, "grouped_clip.txt"},
-                      GoldenCase{"GroupedJSON", &Grouped125, ZEB::AAFDumpOptions::Format::JSON, "grouped_clip.json"}),
+                      GoldenCase{"GroupedJSON", &Grouped125, ZEB::AAFDumpOptions::Format::JSON, "grouped_clip.json"},
+                      GoldenCase{"MetadataText", &BuildMetadataClip, ZEB::AAFDumpOptions::Format::Text,
+                                 "metadata_clip.txt"}),
     [](const auto& info) { return std::string(info.param.name); });
 
 TEST(AAFDump, ClockValuesAppearUnlessOmitted) {

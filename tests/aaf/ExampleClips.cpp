@@ -79,19 +79,18 @@ public:
             Must(m.source->Initialize(), "SourceMob Initialize");
         }
         Must(m.mob->SetMobID(id), "SetMobID");
-        Must(m.mob->SetName(name), "SetName");
+        if (name) Must(m.mob->SetName(name), "SetName");
         return m;
     }
 
-    // The tape's one timecode slot, as the clip builder makes it.
-    void AddTimecodeSlot(IAAFMob* tape) {
+    // The tape's one timecode slot, as the clip builders make it.
+    void AddTimecodeSlot(IAAFMob* tape, aafLength_t length = 25 * 432000, aafPosition_t start = 0) {
         auto sequence = f.Create<IAAFSequence>(kAAFClassID_Sequence);
         Must(sequence->Initialize(timecode.get()), "Sequence Initialize");
         auto component = f.Create<IAAFComponent>(kAAFClassID_Timecode);
-        aafTimecode_t tc{0, 0, 25};
-        Must(Query<IAAFTimecode>(component.get())->Initialize(0, &tc), "Timecode Initialize");
+        aafTimecode_t tc{start, 0, 25};
+        Must(Query<IAAFTimecode>(component.get())->Initialize(length, &tc), "Timecode Initialize");
         Must(component->SetDataDef(timecode.get()), "SetDataDef");
-        const aafLength_t length = 25 * 432000;
         Must(component->SetLength(length), "SetLength");
         Must(sequence->AppendComponent(component.get()), "AppendComponent");
         Must(tape->AppendNewTimelineSlot(kTapeRate, Query<IAAFSegment>(sequence.get()).get(), 1, L"TC1", 0, nullptr),
@@ -270,6 +269,139 @@ IAAFFile* BuildGroupedClip(const std::vector<aafUInt32>& channels) {
     for (auto& file : files) mobs.push_back(file.mob.get());
     mobs.push_back(tape.mob.get());
     return b.Finish(mobs);
+}
+
+namespace {
+
+/// The head frame bitmap as a tagged value appended to the Mob's Attributes
+/// through the generic property interface, as the volume route adds it.
+void AppendHeadFrame(Builder& b, IAAFMob* master, std::vector<aafUInt8> bitmap) {
+    IAAFDictionary* d = b.f.dictionary.get();
+    Ptr<IAAFTypeDef> bytes, reference, vector;
+    Must(d->LookupTypeDef(kAAFTypeID_UInt8Array, bytes.out()), "LookupTypeDef UInt8Array");
+    auto tagged = b.f.Create<IAAFTaggedValue>(kAAFClassID_TaggedValue);
+    Must(tagged->Initialize(L"HeadFrame", bytes.get(), static_cast<aafUInt32>(bitmap.size()), bitmap.data()),
+         "TaggedValue Initialize");
+    Must(d->LookupTypeDef(kAAFTypeID_TaggedValueStrongReference, reference.out()), "LookupTypeDef reference");
+    Ptr<IAAFPropertyValue> element, attributes;
+    Must(Query<IAAFTypeDefObjectRef>(reference.get())->CreateValue(tagged.get(), element.out()), "CreateValue");
+    Ptr<IAAFClassDef> mobClass;
+    Must(d->LookupClassDef(kAAFClassID_Mob, mobClass.out()), "LookupClassDef Mob");
+    Ptr<IAAFPropertyDef> property;
+    Must(mobClass->LookupPropertyDef(kAAFPropID_Mob_Attributes, property.out()), "LookupPropertyDef Attributes");
+    auto object = Query<IAAFObject>(master);
+    aafBoolean_t present = kAAFFalse;
+    Must(object->IsPropertyPresent(property.get(), &present), "IsPropertyPresent");
+    if (present)
+        Must(object->GetPropertyValue(property.get(), attributes.out()), "GetPropertyValue");
+    else
+        Must(object->CreateOptionalPropertyValue(property.get(), attributes.out()), "CreateOptionalPropertyValue");
+    Must(d->LookupTypeDef(kAAFTypeID_TaggedValueStrongReferenceVector, vector.out()), "LookupTypeDef vector");
+    Must(Query<IAAFTypeDefVariableArray>(vector.get())->AppendElement(attributes.get(), element.get()),
+         "AppendElement");
+}
+
+/// One memo: a descriptive marker at `offset` with its comment, appended to
+/// the event slot's sequence, which the first memo makes.
+void AddMark(Builder& b, Ptr<IAAFEventMobSlot>& slot, Ptr<IAAFSequence>& marks, aafPosition_t offset,
+             const wchar_t* text) {
+    Ptr<IAAFDataDef> descriptive = b.f.DataDef(kAAFDataDef_DescriptiveMetadata);
+    auto marker = b.f.Create<IAAFDescriptiveMarker>(kAAFClassID_DescriptiveMarker);
+    Must(marker->Initialize(), "DescriptiveMarker Initialize");
+    auto event = Query<IAAFEvent>(Query<IAAFCommentMarker>(marker.get()).get());
+    Must(event->SetPosition(offset), "SetPosition");
+    Must(Query<IAAFComponent2>(marker.get())->AppendComment(L"Comment", text), "Component AppendComment");
+    auto component = Query<IAAFComponent>(marker.get());
+    Must(component->SetDataDef(descriptive.get()), "SetDataDef");
+    if (!slot) {
+        slot = b.f.Create<IAAFEventMobSlot>(kAAFClassID_EventMobSlot);
+        aafRational_t rate = kMovieRate;
+        Must(slot->SetEditRate(&rate), "SetEditRate");
+        auto mobSlot = Query<IAAFMobSlot>(slot.get());
+        Must(mobSlot->SetPhysicalNum(1), "SetPhysicalNum");
+        marks = b.f.Create<IAAFSequence>(kAAFClassID_Sequence);
+        Must(Query<IAAFComponent>(marks.get())->SetDataDef(descriptive.get()), "Sequence SetDataDef");
+        Must(marks->AppendComponent(component.get()), "AppendComponent");
+        Must(mobSlot->SetSegment(Query<IAAFSegment>(marks.get()).get()), "SetSegment");
+        Must(mobSlot->SetSlotID(1001), "SetSlotID");
+    } else {
+        Must(marks->AppendComponent(component.get()), "AppendComponent");
+    }
+}
+
+/// Physical numbers 1 for the first three slots, 2 for the rest.
+void SetPhysicalTrack(IAAFMob* mob) {
+    aafNumSlots_t count = 0;
+    Must(mob->CountSlots(&count), "CountSlots");
+    for (aafUInt32 i = 0; i < count; ++i) {
+        Ptr<IAAFMobSlot> slot;
+        Must(mob->GetSlotAt(i, slot.out()), "GetSlotAt");
+        Must(slot->SetPhysicalNum(i < 3 ? 1 : 2), "SetPhysicalNum");
+    }
+}
+
+}  // namespace
+
+IAAFFile* BuildMetadataClip() {
+    Builder b;
+    const aafMobID_t sourceID = WithByte13(0xB1), sfileID = WithByte13(0xA1);
+    Mob master = b.NewMob(kAAFClassID_MasterMob, BaseMobID(), L"Clip0001");
+    Mob sfile = b.NewMob(kAAFClassID_SourceMob, sfileID, nullptr);
+    auto import = b.f.Create<IAAFImportDescriptor>(kAAFClassID_ImportDescriptor);
+    auto importEssence = Query<IAAFEssenceDescriptor>(import.get());
+    Mob source = b.NewMob(kAAFClassID_SourceMob, sourceID, nullptr);
+    const aafPosition_t startFrame = 90000;  // 01:00:00:00 at 25 frames
+    b.AddTimecodeSlot(sfile.mob.get(), 172800, startFrame);
+    const aafSlotID_t timecodeSlots = 1;
+    const aafRational_t sampleRate{48000, 1};
+    const double ratio = (static_cast<float>(kMovieRate.denominator) * sampleRate.numerator) /
+                         (static_cast<float>(kMovieRate.numerator) * sampleRate.denominator);
+    const aafPosition_t position = static_cast<aafPosition_t>(startFrame * ratio);
+    const wchar_t* url = L"file:///media/card1/Clip0001.vid";
+    for (aafUInt32 track = 1; track <= 2; ++track) {
+        const aafSlotID_t slot = track + timecodeSlots;
+        aafSourceRef_t toSfile{sfileID, slot, position};
+        Must(source.source->NewPhysSourceRef(sampleRate, track, b.sound.get(), toSfile, kSamples),
+             "NewPhysSourceRef");
+        wchar_t name[12];
+        std::swprintf(name, 12, L"A%d", track);
+        aafNumSlots_t count = 0;
+        Must(master.mob->CountSlots(&count), "CountSlots");
+        Must(master.master->AddMasterSlot(b.sound.get(), track, source.source.get(), count + 1, name),
+             "AddMasterSlot");
+        const double padding = std::ceil(kMovieRate.numerator * 172800.0 / kMovieRate.denominator);
+        const aafLength_t length = kSamples + (kSamples < padding ? static_cast<aafLength_t>(padding) : 0);
+        Must(sfile.source->AddNilReference(slot, length, b.sound.get(), sampleRate), "AddNilReference");
+        Must(b.Slot(sfile.mob.get(), slot)->SetName(name), "SetName");
+        Must(b.Slot(source.mob.get(), track)->SetName(name), "SetName");
+        auto locator = b.f.Create<IAAFNetworkLocator>(kAAFClassID_NetworkLocator);
+        Must(Query<IAAFLocator>(locator.get())->SetPath(url), "SetPath");
+        Must(importEssence->AppendLocator(Query<IAAFLocator>(locator.get()).get()), "AppendLocator");
+    }
+    Must(master.mob->AppendComment(L"Shooter", L"Camera B"), "AppendComment");
+    Ptr<IAAFEventMobSlot> eventSlot;
+    Ptr<IAAFSequence> marks;
+    AddMark(b, eventSlot, marks, 0, L"Slate");
+    AddMark(b, eventSlot, marks, 125, L"Clap (Sound Op)");
+    AddMark(b, eventSlot, marks, 250, L"Cut");
+
+    Must(master.mob->AppendSlot(Query<IAAFMobSlot>(eventSlot.get()).get()), "AppendSlot");
+    for (IAAFMob* mob : {master.mob.get(), source.mob.get(), sfile.mob.get()}) SetPhysicalTrack(mob);
+    auto multiple = b.f.Create<IAAFMultipleDescriptor>(kAAFClassID_MultipleDescriptor);
+    Must(multiple->Initialize(), "MultipleDescriptor Initialize");
+    for (int track = 0; track < 2; ++track) {
+        auto pcm = b.NewPCM(kSamples);
+        b.AddLocator(Query<IAAFEssenceDescriptor>(pcm.get()).get(), url);
+        Must(multiple->AppendFileDescriptor(Query<IAAFFileDescriptor>(pcm.get()).get()), "AppendFileDescriptor");
+    }
+    Must(source.source->SetEssenceDescriptor(Query<IAAFEssenceDescriptor>(multiple.get()).get()),
+         "SetEssenceDescriptor");
+    Must(sfile.source->SetEssenceDescriptor(importEssence.get()), "SetEssenceDescriptor");
+    auto master2 = Query<IAAFMob2>(master.mob.get());
+    Must(master2->AppendAttribute(L"HeadFrameType", L"BMP"), "AppendAttribute");
+    Must(master2->AppendAttribute(L"HeadFrameOffset", L"12"), "AppendAttribute");
+    AppendHeadFrame(b, master.mob.get(), {'B', 'M', 0x3A, 0, 0, 0});
+    return b.Finish({master.mob.get(), source.mob.get(), sfile.mob.get()});
 }
 
 }  // namespace aaftest

@@ -16,5 +16,12 @@ IAAFFile* BuildStereoClip();
 /// A group of mono files with the given channel indices (sorted), one file
 /// Source Mob each, the tape numbered up to the highest channel.
 IAAFFile* BuildGroupedClip(const std::vector<aafUInt32>& channels);
+/// The volume route's clip, in the metadata handler's order: Master Mob with
+/// slots A1 and A2 made by AddMasterSlot, a comment, three memos as
+/// descriptive markers on event slot 1001, head frame attributes and bitmap;
+/// a source Mob with a multiple descriptor of two PCM descriptors; a SFILE
+/// Mob with "TC1", two nil-reference slots and an import descriptor with one
+/// locator per track.
+IAAFFile* BuildMetadataClip();
 
 }  // namespace aaftest
