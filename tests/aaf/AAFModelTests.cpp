@@ -264,6 +264,83 @@ TEST_F(AAFModel, AttributesAppendThroughAnOptionalStrongReferenceVector) {
     EXPECT_EQ(count, 1u);
 }
 
+TEST_F(AAFModel, AddMasterSlotRefersToTheSourceMobSlot) {
+    auto master = NewMasterMob(1);
+    auto sourceMob = f.Create<IAAFMob>(kAAFClassID_SourceMob);
+    auto source = Query<IAAFSourceMob>(sourceMob.get());
+    source->Initialize();
+    sourceMob->SetMobID(MobID(2));
+    auto sound = f.DataDef(kAAFDataDef_LegacySound);
+    auto timecode = f.DataDef(kAAFDataDef_Timecode);
+    aafSourceRef_t toFile{MobID(3), 2, 1920};
+    ASSERT_EQ(source->NewPhysSourceRef({48000, 1}, 1, sound.get(), toFile, 4800), AAFRESULT_SUCCESS);
+    auto masterMob = Query<IAAFMasterMob>(master.get());
+
+    const struct {
+        const char* why;
+        IAAFDataDef* dataDef;
+        aafSlotID_t sourceSlot;
+        IAAFSourceMob* sourceMob;
+        const wchar_t* name;
+        AAFRESULT result;
+    } misuse[] = {
+        {"another kind of data", timecode.get(), 1, source.get(), L"A1", AAFRESULT_INVALID_DATADEF},
+        {"a slot the source lacks", sound.get(), 9, source.get(), L"A1", AAFRESULT_SLOT_NOT_FOUND},
+        {"no source", sound.get(), 1, nullptr, L"A1", AAFRESULT_NULL_PARAM},
+        {"no name", sound.get(), 1, source.get(), nullptr, AAFRESULT_NULL_PARAM},
+    };
+    for (const auto& m : misuse)
+        EXPECT_EQ(masterMob->AddMasterSlot(m.dataDef, m.sourceSlot, m.sourceMob, 1, m.name), m.result) << m.why;
+    aafNumSlots_t count = 9;
+    master->CountSlots(&count);
+    EXPECT_EQ(count, 0u);
+
+    ASSERT_EQ(masterMob->AddMasterSlot(sound.get(), 1, source.get(), 1, L"A1"), AAFRESULT_SUCCESS);
+    Ptr<IAAFMobSlot> slot;
+    ASSERT_EQ(master->LookupSlot(1, slot.out()), AAFRESULT_SUCCESS);
+    aafRational_t rate{};
+    Query<IAAFTimelineMobSlot>(slot.get())->GetEditRate(&rate);
+    EXPECT_EQ(rate.numerator, 48000);
+    Ptr<IAAFSegment> segment;
+    slot->GetSegment(segment.out());
+    aafLength_t length = 0;
+    Query<IAAFComponent>(segment.get())->GetLength(&length);
+    EXPECT_EQ(length, 4800);
+    auto clip = Query<IAAFSourceReference>(segment.get());
+    aafMobID_t id{};
+    aafSlotID_t sourceSlot = 0;
+    clip->GetSourceID(&id);
+    clip->GetSourceMobSlotID(&sourceSlot);
+    EXPECT_EQ(id, MobID(2));  // the source Mob, not where its clip leads
+    EXPECT_EQ(sourceSlot, 1u);
+}
+
+TEST_F(AAFModel, TaggedValueBytesOfAnySizeIncludingNone) {
+    Ptr<IAAFTypeDef> bytes;
+    f.dictionary->LookupTypeDef(kAAFTypeID_UInt8Array, bytes.out());
+    aafUInt8 data[3] = {0x42, 0x4D, 0x3A};
+    const struct {
+        aafUInt8* buffer;
+        aafUInt32 size;
+        AAFRESULT result;
+    } cases[] = {
+        {nullptr, 0, AAFRESULT_SUCCESS}, {data, 0, AAFRESULT_SUCCESS}, {data, 3, AAFRESULT_SUCCESS},
+        {nullptr, 3, AAFRESULT_NULL_PARAM},
+    };
+    for (const auto& c : cases) {
+        auto tagged = f.Create<IAAFTaggedValue>(kAAFClassID_TaggedValue);
+        ASSERT_EQ(tagged->Initialize(L"HeadFrame", bytes.get(), c.size, c.buffer), c.result) << c.size;
+        if (c.result != AAFRESULT_SUCCESS) continue;
+        aafUInt32 length = 99, read = 99;
+        ASSERT_EQ(tagged->GetValueBufLen(&length), AAFRESULT_SUCCESS);
+        EXPECT_EQ(length, c.size);
+        aafUInt8 out[3] = {};
+        ASSERT_EQ(tagged->GetValue(sizeof out, out, &read), AAFRESULT_SUCCESS);
+        EXPECT_EQ(read, c.size);
+        EXPECT_EQ(std::vector<aafUInt8>(out, out + read), std::vector<aafUInt8>(data, data + c.size));
+    }
+}
+
 TEST_F(AAFModel, PictureDescriptorsComeFromACallersConcreteClass) {
     const aafUID_t pictureId = {0x7E57C1A5, 1, 2, {3, 4, 5, 6, 7, 8, 9, 10}};
     Ptr<IAAFDigitalImageDescriptor> abstract;
