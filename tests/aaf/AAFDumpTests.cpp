@@ -39,6 +39,9 @@ struct GoldenCase {
     const char* golden;
 };
 
+// Names the case in test output instead of its bytes.
+void PrintTo(const GoldenCase& c, std::ostream* out) { *out << c.name; }
+
 IAAFFile* Grouped125() { return BuildGroupedClip({1, 2, 5}); }
 
 class AAFDumpGolden : public ::testing::TestWithParam<GoldenCase> {};

@@ -93,6 +93,9 @@ struct BoxCase {
     aafBoundsBox_t essenceBox, sourceBox, validBox;
 };
 
+// Names the case in test output instead of its bytes.
+void PrintTo(const BoxCase& c, std::ostream* out) { *out << c.name; }
+
 class DefaultBoxes : public ::testing::TestWithParam<BoxCase> {};
 
 TEST_P(DefaultBoxes, AreCentredInTheWorldFrame) {
