@@ -6,21 +6,20 @@
 #include <locale.h>
 #include <vector>
 
+#include "tov/host/UTF8Locale.h"
 #include "tov/host/UnicodeCodec.h"
 
 namespace {
 
-// vswprintf converts `%s` arguments with the thread's LC_CTYPE; a UTF-8 locale
-// for this thread alone leaves the process locale untouched.
+// vswprintf converts `%s` arguments with the thread's LC_CTYPE; the host's
+// UTF-8 locale, current for this thread alone, leaves the process locale untouched.
 class ScopedUTF8Locale {
 public:
-    ScopedUTF8Locale() : m_Locale(newlocale(LC_CTYPE_MASK, "C.UTF-8", static_cast<locale_t>(0))) {
+    ScopedUTF8Locale() : m_Locale(UTF8Locale()) {
         if (m_Locale) m_Previous = uselocale(m_Locale);
     }
     ~ScopedUTF8Locale() {
-        if (!m_Locale) return;
-        uselocale(m_Previous);
-        freelocale(m_Locale);
+        if (m_Locale) uselocale(m_Previous);
     }
     ScopedUTF8Locale(const ScopedUTF8Locale&) = delete;
     ScopedUTF8Locale& operator=(const ScopedUTF8Locale&) = delete;

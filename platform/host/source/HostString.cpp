@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cstring>
 
+#include "tov/host/UTF8Locale.h"
 #include "tov/host/UnicodeCodec.h"
 #include "tov/sdk/TOVComponent.h"
 #include "tov/sdk/TOVPtr.h"
@@ -84,9 +85,8 @@ TOVRESULT CopyUnits(const Units& units, Unit* out, unsigned int* size) {
     return TOV_OK;
 }
 
-// Created once and kept for the life of the process.
 locale_t CaseLocale() {
-    static const locale_t locale = newlocale(LC_CTYPE_MASK, "C.UTF-8", static_cast<locale_t>(0));
+    const locale_t locale = UTF8Locale();
     if (!locale) Fail(TOV_E_NOTSUPPORTED);
     return locale;
 }

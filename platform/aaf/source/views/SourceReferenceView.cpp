@@ -18,6 +18,12 @@ void GetIDs(const ModelObject& ref, const PropertyDefinition& def, aafUInt32 cou
     if (count < values.size()) throw static_cast<int>(AAFRESULT_SMALLBUF);
     std::copy(values.begin(), values.end(), ids);
 }
+
+AAFRESULT CountIDs(const ModelObject& ref, const PropertyDefinition& def, aafUInt32* count) {
+    if (!count) return AAFRESULT_NULL_PARAM;
+    *count = static_cast<aafUInt32>(ref.GetUInt32Array(def).size());
+    return AAFRESULT_SUCCESS;
+}
 }  // namespace
 
 AAFRESULT SourceReferenceView::GetSourceID(aafMobID_t* pSourceID) {
@@ -65,9 +71,7 @@ AAFRESULT SourceReferenceView::GetChannelIDs(aafUInt32 numberElements, aafUInt32
 }
 
 AAFRESULT SourceReferenceView::GetChannelIDsSize(aafUInt32* numberElements) {
-    if (!numberElements) return AAFRESULT_NULL_PARAM;
-    *numberElements = static_cast<aafUInt32>(m_object.GetUInt32Array(*Builtins(m_object).p.sourceRefChannelIDs).size());
-    return AAFRESULT_SUCCESS;
+    return CountIDs(m_object, *Builtins(m_object).p.sourceRefChannelIDs, numberElements);
 }
 
 AAFRESULT SourceReferenceView::SetMonoSourceSlotIDs(aafUInt32 numberElements, aafUInt32* pMonoSourceSlotIDs) {
@@ -85,10 +89,7 @@ AAFRESULT SourceReferenceView::GetMonoSourceSlotIDs(aafUInt32 numberElements, aa
 }
 
 AAFRESULT SourceReferenceView::GetMonoSourceSlotIDsSize(aafUInt32* numberElements) {
-    if (!numberElements) return AAFRESULT_NULL_PARAM;
-    *numberElements =
-        static_cast<aafUInt32>(m_object.GetUInt32Array(*Builtins(m_object).p.sourceRefMonoSourceSlotIDs).size());
-    return AAFRESULT_SUCCESS;
+    return CountIDs(m_object, *Builtins(m_object).p.sourceRefMonoSourceSlotIDs, numberElements);
 }
 
 }  // namespace aafmodel
