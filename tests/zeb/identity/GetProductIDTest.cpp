@@ -1,0 +1,42 @@
+// The product identification: the caller's values in place, the platform text
+// as recorded, and the version record shared by every call.
+#include <gtest/gtest.h>
+
+#include <string>
+
+#include "identity/GetProductID.h"
+
+namespace {
+
+constexpr _tovUID kProductID = {0x3711D3CC, 0x62D0, 0x49D7, {0xB0, 0xAE, 0xC1, 0x18, 0x10, 0x1D, 0x1A, 0x16}};
+
+TEST(GetProductID, FillsTheRecordWithTheCallersTextsAndTheStaticPlatform) {
+    const wchar_t* company = L"Orrin Technology, Inc.";
+    const wchar_t* product = L"Orlo Plug-In";
+    const wchar_t* version = L"1.9.1.10178";
+    _aafProductIdentification_t id{};
+    ZEB::GetProductID(id, 1, 9, 1, 10178, company, product, version, kProductID);
+    EXPECT_EQ(id.companyName, company);
+    EXPECT_EQ(id.productName, product);
+    EXPECT_EQ(id.productVersionString, version);
+    EXPECT_EQ(std::wstring(id.platform), L"MacOS X");
+    const _aafUID_t expected = {0x3711D3CC, 0x62D0, 0x49D7, {0xB0, 0xAE, 0xC1, 0x18, 0x10, 0x1D, 0x1A, 0x16}};
+    EXPECT_EQ(id.productID, expected);
+    ASSERT_NE(id.productVersion, nullptr);
+    EXPECT_EQ(id.productVersion->major, 1);
+    EXPECT_EQ(id.productVersion->minor, 9);
+    EXPECT_EQ(id.productVersion->tertiary, 1);
+    EXPECT_EQ(id.productVersion->patchLevel, 10178);
+    EXPECT_EQ(id.productVersion->type, kAAFVersionUnknown);
+}
+
+TEST(GetProductID, EveryCallRewritesTheOneVersionRecord) {
+    _aafProductIdentification_t first{}, second{};
+    ZEB::GetProductID(first, 1, 2, 3, 4, L"a", L"b", L"c", kProductID);
+    ZEB::GetProductID(second, 5, 6, 7, 8, L"a", L"b", L"c", kProductID);
+    EXPECT_EQ(first.productVersion, second.productVersion);
+    EXPECT_EQ(first.platform, second.platform);
+    EXPECT_EQ(first.productVersion->major, 5) << "the earlier record sees the later numbers";
+}
+
+}  // namespace
