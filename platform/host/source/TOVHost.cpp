@@ -1,8 +1,11 @@
 #include "tov/host/TOVHost.h"
 
 #include "tov/host/HostComponentDefinition.h"
+#include "tov/host/HostFTFManager.h"
 #include "tov/host/HostPluginDefinition.h"
+#include "tov/host/HostSettings.h"
 #include "tov/host/HostString.h"
+#include "tov/host/HostUIDGeneratorMD5.h"
 #include "tov/host/HostXmlParser.h"
 #include "tov/host/HostXmlSaxParser.h"
 #include "tov/host/HostXmlWriter.h"
@@ -30,6 +33,12 @@ TOVPtr<TOVHost> TOVHost::Create() {
                                    HostXmlSaxParser::TOVCreate));
     TOVCheck(host->RegisterBuiltin(UTIL::CompID_TOVXmlWriter, CLSID_HostXmlWriter, L"TOVXmlWriter",
                                    HostXmlWriter::TOVCreate));
+    TOVCheck(host->RegisterBuiltin(TOVCompID_FTFManager, CLSID_HostFTFManager, L"FTFManager",
+                                   HostFTFManager::TOVCreate));
+    TOVCheck(host->RegisterBuiltin(CompID_HostSettings, CLSID_HostSettings, L"HostSettings",
+                                   HostSettings::TOVCreate));
+    TOVCheck(host->RegisterBuiltin(TOVCompID_UIDGenerator, CLSID_HostUIDGeneratorMD5, L"UIDGeneratorMD5",
+                                   HostUIDGeneratorMD5::TOVCreate));
     return host;
 }
 
@@ -128,6 +137,7 @@ TOVRESULT TOVHost::InternalQueryInterface(const _tovUID& iid, void** out) {
         if (iid == IID_ITOVComponentFactory) return TOVExpose<ITOVComponentFactory>(this, out);
         if (iid == IID_ITOVConsole) return TOVExpose<ITOVConsole>(this, out);
         if (iid == IID_ITOVDefinition) return TOVExpose<ITOVDefinition>(this, out);
+        if (iid == IID_IHostStores) return TOVExpose<IHostStores>(this, out);
         return CTOVUnknown::InternalQueryInterface(iid, out);
     });
 }

@@ -15,7 +15,7 @@ inline constexpr _tovUID ZEBHostSetting_AutodetectMonophonicBroadcastWaveGroups 
 /// The `size` argument is the size in bits of the value passed; the host's
 /// settings are unsigned 32-bit numbers, and callers pass 16 by long habit,
 /// which the host accepts for them too (any size from 1 to 32 bits reads and
-/// writes the whole 32-bit value). A size above 32 is TOV_E_INVALIDARG.
+/// writes the whole 32-bit value). A size of 0 or above 32 is TOV_E_INVALIDARG.
 class IHostSettings : public ITOVUnknown {
 public:
     /// Stores a value; it then answers every GetSetting of this host.

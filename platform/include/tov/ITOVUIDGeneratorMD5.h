@@ -16,7 +16,9 @@ public:
     /// Feeds `count` bytes; a count of 0 is allowed and adds nothing.
     virtual TOVRESULT AddData(void* context, unsigned char* data, unsigned int count) = 0;
     /// Ends the digest, writes its 16 bytes into `result` and frees the
-    /// context, setting `*context` to null.
+    /// context, setting `*context` to null. The bytes are the digest copied
+    /// unaltered and in order into the record's memory, so Data1 to Data3 read
+    /// as numbers in the machine's byte order.
     virtual TOVRESULT Finish(_aafUID_t* result, void** context) = 0;
 
 protected:

@@ -1,7 +1,8 @@
 #pragma once
 /// The reference host: one object that is the component factory, the console
 /// and the host's own definition, with a registry of built-in components and of
-/// components of modules loaded from disk.
+/// components of modules loaded from disk. It owns the toggle and settings
+/// stores that its built-in toggle managers and settings objects share.
 ///
 /// Ownership: `Create` hands out the only reference. Loaded modules hold
 /// references to the host until they are shut down, so the owner calls
@@ -16,11 +17,16 @@
 #include "tov/host/ComponentRegistry.h"
 #include "tov/host/DefinitionAttributes.h"
 #include "tov/host/HostConsole.h"
+#include "tov/host/IHostStores.h"
 #include "tov/host/PluginModule.h"
 #include "tov/sdk/CTOVUnknown.h"
 #include "tov/sdk/TOVPtr.h"
 
-class TOVHost : public ITOVComponentFactory, public ITOVConsole, public ITOVDefinition, public CTOVUnknown {
+class TOVHost : public ITOVComponentFactory,
+                public ITOVConsole,
+                public ITOVDefinition,
+                public IHostStores,
+                public CTOVUnknown {
 public:
     /// A host with its built-in components registered.
     static TOVPtr<TOVHost> Create();
@@ -43,6 +49,10 @@ public:
     // ITOVDefinition: the host's own name and version.
     TOVRESULT GetAttribute(const _tovUID& attribute, const _tovUID& type, void* out, unsigned int size) override;
     TOVRESULT SetAttribute(const _tovUID& attribute, const _tovUID& type, const void* value, int size) override;
+
+    // IHostStores: for the host's own components.
+    std::shared_ptr<HostToggleStore> ToggleStore() override { return m_Toggles; }
+    std::shared_ptr<HostSettingValues> SettingStore() override { return m_Settings; }
 
     TOVRESULT InternalQueryInterface(const _tovUID& iid, void** out) override;
 
@@ -83,4 +93,7 @@ private:
     DefinitionAttributes m_Attributes;
     ComponentRegistry m_Registry;
     std::vector<LoadedModule> m_Modules;
+    // Shared, so that a manager or settings object outliving the host stays valid.
+    std::shared_ptr<HostToggleStore> m_Toggles = std::make_shared<HostToggleStore>();
+    std::shared_ptr<HostSettingValues> m_Settings = std::make_shared<HostSettingValues>();
 };

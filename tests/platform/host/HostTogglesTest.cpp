@@ -1,0 +1,183 @@
+// The host's feature-toggle manager: one store per host, seen by every manager object of it.
+#include <gtest/gtest.h>
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "TestHost.h"
+#include "tov/IFTFManager.h"
+#include "tov/host/HostFTFManager.h"
+#include "tov/host/HostText.h"
+
+namespace {
+
+constexpr const char* kPath = "/Area/Feature";
+constexpr const char* kOther = "/Area/Other";
+
+TOVPtr<IFTFManager> NewManager(TOVHost* host) {
+    TOVPtr<IFTFManager> manager;
+    EXPECT_EQ(host->CreateComponent(TOVCompID_FTFManager, nullptr, IID_IFTFManager, manager.Out()), TOV_OK);
+    return manager;
+}
+
+std::string TextOf(ITOVString* text) {
+    TOVPtr<ITOVString> owned(text);
+    return HostText::Read(text);
+}
+
+uint32_t ValueOf(IFTFManager& manager, const char* path) {
+    uint32_t value = 0xDEAD;
+    EXPECT_EQ(manager.GetToggleValue(path, &value), TOV_OK);
+    return value;
+}
+
+class HostToggles : public ::testing::Test {
+protected:
+    TestHost host;
+    TOVPtr<IFTFManager> manager = NewManager(host.Get());
+};
+
+TEST_F(HostToggles, AreSharedByTheManagersOfOneHostOnly) {
+    ASSERT_EQ(manager->RegisterToggle(kPath, 0, "group"), TOV_OK);
+    TOVPtr<IFTFManager> second = NewManager(host.Get());
+    EXPECT_EQ(second->IsToggleRegistered(kPath), 1);
+    ASSERT_EQ(second->SetToggleValue(kPath, 7), TOV_OK);
+    EXPECT_EQ(ValueOf(*manager, kPath), 7u);
+
+    TestHost otherHost;
+    TOVPtr<IFTFManager> elsewhere = NewManager(otherHost.Get());
+    EXPECT_EQ(elsewhere->IsToggleRegistered(kPath), 0);
+    ASSERT_EQ(elsewhere->RegisterToggle(kPath, 3, "group"), TOV_OK);
+    EXPECT_EQ(ValueOf(*elsewhere, kPath), 3u);
+    EXPECT_EQ(ValueOf(*manager, kPath), 7u);
+}
+
+TEST_F(HostToggles, ASecondRegistrationIsRefusedAndKeepsValueDefaultAndGroup) {
+    ASSERT_EQ(manager->RegisterToggle(kPath, 1, "first"), TOV_OK);
+    ASSERT_EQ(manager->SetToggleValue(kPath, 5), TOV_OK);
+    EXPECT_EQ(manager->RegisterToggle(kPath, 9, "second"), ZEB_E_ALREADYSET);
+    EXPECT_EQ(ValueOf(*manager, kPath), 5u);
+    uint32_t defaultValue = 0;
+    EXPECT_EQ(manager->GetToggleDefault(kPath, &defaultValue), TOV_OK);
+    EXPECT_EQ(defaultValue, 1u);
+    ITOVString* group = nullptr;
+    ASSERT_EQ(manager->GetToggleGroup(kPath, &group), TOV_OK);
+    EXPECT_EQ(TextOf(group), "first");
+    uint32_t count = 0;
+    EXPECT_EQ(manager->GetToggleCount(&count), TOV_OK);
+    EXPECT_EQ(count, 1u);
+}
+
+TEST_F(HostToggles, ListsPathsInOrderOfRegistration) {
+    for (const char* path : {kOther, kPath, ""}) ASSERT_EQ(manager->RegisterToggle(path, 0, "g"), TOV_OK);
+    ASSERT_EQ(manager->UnregisterToggle(kOther), TOV_OK);
+    ASSERT_EQ(manager->RegisterToggle(kOther, 0, "g"), TOV_OK);  // goes to the end
+
+    uint32_t count = 0;
+    ASSERT_EQ(manager->GetToggleCount(&count), TOV_OK);
+    ASSERT_EQ(count, 3u);
+    std::vector<std::string> paths;
+    for (uint32_t index = 0; index < count; ++index) {
+        ITOVString* path = nullptr;
+        ASSERT_EQ(manager->GetTogglePath(index, &path), TOV_OK);
+        paths.push_back(TextOf(path));
+    }
+    EXPECT_EQ(paths, (std::vector<std::string>{kPath, "", kOther}));
+    ITOVString* past = reinterpret_cast<ITOVString*>(0x1);
+    EXPECT_EQ(manager->GetTogglePath(count, &past), TOV_E_OUTOFRANGE);
+    EXPECT_EQ(past, nullptr);
+}
+
+TEST_F(HostToggles, ResetGoesBackToTheDefaultAndUnregisterForgetsTheValue) {
+    ASSERT_EQ(manager->RegisterToggle(kPath, 4, "g"), TOV_OK);
+    ASSERT_EQ(manager->SetToggleValue(kPath, 0), TOV_OK);
+    ASSERT_EQ(manager->ResetToggle(kPath), TOV_OK);
+    EXPECT_EQ(ValueOf(*manager, kPath), 4u);
+
+    ASSERT_EQ(manager->SetToggleValue(kPath, 8), TOV_OK);
+    ASSERT_EQ(manager->UnregisterToggle(kPath), TOV_OK);
+    EXPECT_EQ(manager->IsToggleRegistered(kPath), 0);
+    ASSERT_EQ(manager->RegisterToggle(kPath, 2, "g"), TOV_OK);
+    EXPECT_EQ(ValueOf(*manager, kPath), 2u);
+}
+
+struct SlotCase {
+    const char* name;
+    std::function<TOVRESULT(IFTFManager&, const char* path)> call;
+};
+
+// Every slot that takes a path, called with a path that is not registered and with none.
+const SlotCase kPathSlots[] = {
+    {"GetToggleGroup", [](IFTFManager& m, const char* p) {
+         ITOVString* group = nullptr;
+         const TOVRESULT result = m.GetToggleGroup(p, &group);
+         EXPECT_EQ(group, nullptr);
+         return result;
+     }},
+    {"GetToggleDefault", [](IFTFManager& m, const char* p) {
+         uint32_t value = 0xDEAD;
+         const TOVRESULT result = m.GetToggleDefault(p, &value);
+         EXPECT_EQ(value, 0xDEADu);
+         return result;
+     }},
+    {"GetToggleValue", [](IFTFManager& m, const char* p) {
+         uint32_t value = 0xDEAD;
+         const TOVRESULT result = m.GetToggleValue(p, &value);
+         EXPECT_EQ(value, 0xDEADu);
+         return result;
+     }},
+    {"SetToggleValue", [](IFTFManager& m, const char* p) { return m.SetToggleValue(p, 1); }},
+    {"ResetToggle", [](IFTFManager& m, const char* p) { return m.ResetToggle(p); }},
+    {"UnregisterToggle", [](IFTFManager& m, const char* p) { return m.UnregisterToggle(p); }},
+};
+
+TEST_F(HostToggles, UnknownPathsAreNotFoundAndNullPathsInvalid) {
+    ASSERT_EQ(manager->RegisterToggle(kOther, 0, "g"), TOV_OK);
+    for (const SlotCase& slot : kPathSlots) {
+        SCOPED_TRACE(slot.name);
+        EXPECT_EQ(slot.call(*manager, kPath), ZEB_E_NOTFOUND);
+        EXPECT_EQ(slot.call(*manager, "/area/other"), ZEB_E_NOTFOUND);  // paths keep their case
+        EXPECT_EQ(slot.call(*manager, nullptr), TOV_E_INVALIDARG);
+    }
+    EXPECT_EQ(manager->IsToggleRegistered(kPath), 0);
+    EXPECT_EQ(manager->IsToggleRegistered(nullptr), 0);
+    EXPECT_EQ(manager->IsToggleRegistered(kOther), 1);
+    EXPECT_EQ(ValueOf(*manager, kOther), 0u);  // nothing above touched the registered one
+}
+
+TEST_F(HostToggles, NullPlacesForResultsAreInvalid) {
+    ASSERT_EQ(manager->RegisterToggle(kPath, 0, "g"), TOV_OK);
+    EXPECT_EQ(manager->RegisterToggle(kOther, 0, nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->RegisterToggle(nullptr, 0, "g"), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->GetToggleCount(nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->GetTogglePath(0, nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->GetToggleGroup(kPath, nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->GetToggleDefault(kPath, nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->GetToggleValue(kPath, nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->IsToggleRegistered(kOther), 0);
+}
+
+TEST_F(HostToggles, AManagerOutlivingItsHostKeepsTheToggles) {
+    TOVPtr<IFTFManager> survivor;
+    {
+        TestHost shortLived;
+        survivor = NewManager(shortLived.Get());
+        ASSERT_EQ(survivor->RegisterToggle(kPath, 6, "g"), TOV_OK);
+    }
+    EXPECT_EQ(ValueOf(*survivor, kPath), 6u);
+}
+
+TEST(HostTogglesCreation, NeedsAHostWithAStore) {
+    TOVPtr<IFTFManager> manager;
+    EXPECT_EQ(HostFTFManager::TOVCreate(nullptr, nullptr, IID_IFTFManager, manager.Out()), ZEB_E_NOTREADY);
+    EXPECT_FALSE(manager);
+    // Any component other than the host: it has no stores to give.
+    TestHost host;
+    TOVPtr<ITOVUnknown> notAHost;
+    ASSERT_EQ(host->CreateComponent(TOVCompID_TOVString, nullptr, IID_ITOVUnknown, notAHost.Out()), TOV_OK);
+    EXPECT_EQ(HostFTFManager::TOVCreate(notAHost.Get(), nullptr, IID_IFTFManager, manager.Out()), TOV_E_NOINTERFACE);
+    EXPECT_FALSE(manager);
+}
+
+}  // namespace
