@@ -1,9 +1,8 @@
 // Content identifiers of files: which blocks are read at which offsets, and
 // the results and clean-up on every way out. Large files are sparse.
 #include <fcntl.h>
-#include <unistd.h>
-
 #include <gtest/gtest.h>
+#include <unistd.h>
 
 #include <algorithm>
 #include <cstdint>
@@ -148,8 +147,7 @@ TEST_F(GenerateUMIDFromFileContent, FailuresEndTheWorkAndReleaseTheGenerator) {
     using G = GeneratorFactory::Generator;
     const std::vector<Case> cases = {
         {"no generator", G::Missing, TOV_OK, TOV_OK, TOV_OK, big.Path(), TOV_E_UNEXPECTED, marked, 0, 0, 0},
-        {"null generator", G::NullOnSuccess, TOV_OK, TOV_OK, TOV_OK, big.Path(), TOV_E_UNEXPECTED, cleared, 0, 0,
-         0},
+        {"null generator", G::NullOnSuccess, TOV_OK, TOV_OK, TOV_OK, big.Path(), TOV_E_UNEXPECTED, cleared, 0, 0, 0},
         {"missing file", G::Fake, TOV_OK, TOV_OK, TOV_OK, missing, TOV_E_FILEOPEN, cleared, 0, 0, 0},
         {"begin fails", G::Fake, TOV_E_FAIL, TOV_OK, TOV_OK, big.Path(), TOV_E_FAIL, cleared, 1, 0, 0},
         {"add fails", G::Fake, TOV_OK, TOV_E_OUTOFMEMORY, TOV_OK, big.Path(), TOV_E_OUTOFMEMORY, cleared, 1, 1, 0},

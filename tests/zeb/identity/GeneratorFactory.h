@@ -26,12 +26,12 @@ public:
         if (compID != TOVCompID_UIDGenerator) return m_Host->CreateComponent(compID, outer, iid, out);
         *out = nullptr;
         switch (generator) {
-        case Generator::Fake:
-            return TOVCreateComponent<FakeUIDGenerator>(m_Host->AsUnknown(), outer, iid, out);
-        case Generator::Missing:
-            return ZEB_E_NOTFOUND;
-        case Generator::NullOnSuccess:
-            return TOV_OK;
+            case Generator::Fake:
+                return TOVCreateComponent<FakeUIDGenerator>(m_Host->AsUnknown(), outer, iid, out);
+            case Generator::Missing:
+                return ZEB_E_NOTFOUND;
+            case Generator::NullOnSuccess:
+                return TOV_OK;
         }
         return TOV_E_UNEXPECTED;
     }

@@ -46,8 +46,9 @@ TEST(GetMobIDFromString, ShortOrBrokenTextLeavesStaleBytesAndStillSucceeds) {
         {"one digit gives the first byte a value", "7", {0}},
         {"not hexadecimal", std::string(64, 'z'), {}},
         {"a bad pair in the label skips only that byte", "01zz03", {0, 2}},
-        {"the instance stops at its first bad pair", std::string(24, '0') + "0102zz04", {0, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10,
-                                                                                          11, 12, 13}},
+        {"the instance stops at its first bad pair",
+         std::string(24, '0') + "0102zz04",
+         {0, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13}},
         {"up to the material", std::string(32, '0'), {0, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13, 14, 15}},
     };
     for (const auto& c : cases) {
@@ -65,8 +66,6 @@ TEST(GetMobIDFromString, ShortOrBrokenTextLeavesStaleBytesAndStillSucceeds) {
     }
 }
 
-TEST(GetMobIDFromString, RefusesANullRecord) {
-    EXPECT_EQ(GetMobIDFromString("00", nullptr), TOV_E_INVALIDARG);
-}
+TEST(GetMobIDFromString, RefusesANullRecord) { EXPECT_EQ(GetMobIDFromString("00", nullptr), TOV_E_INVALIDARG); }
 
 }  // namespace

@@ -7,8 +7,8 @@ namespace ZEB {
 static_assert(sizeof(_tovUID) == sizeof(_aafUID_t), "the framework's identifiers are AAF UIDs");
 
 void GetProductID(_aafProductIdentification_t& product, unsigned short major, unsigned short minor,
-                  unsigned short tertiary, unsigned short patchLevel, const wchar_t* company, const wchar_t* productName,
-                  const wchar_t* version, _tovUID productID) {
+                  unsigned short tertiary, unsigned short patchLevel, const wchar_t* company,
+                  const wchar_t* productName, const wchar_t* version, _tovUID productID) {
     // Every caller writes the same values, so the statics need no lock. The
     // platform text is the file format's record of the original platform and
     // stays as it is on every system.

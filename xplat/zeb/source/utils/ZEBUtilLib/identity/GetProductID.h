@@ -9,7 +9,7 @@ namespace ZEB {
 /// this function, rewritten at every call; the three texts are the caller's.
 /// The record is valid only as long as those texts are.
 void GetProductID(_aafProductIdentification_t& product, unsigned short major, unsigned short minor,
-                  unsigned short tertiary, unsigned short patchLevel, const wchar_t* company, const wchar_t* productName,
-                  const wchar_t* version, _tovUID productID);
+                  unsigned short tertiary, unsigned short patchLevel, const wchar_t* company,
+                  const wchar_t* productName, const wchar_t* version, _tovUID productID);
 
 }  // namespace ZEB

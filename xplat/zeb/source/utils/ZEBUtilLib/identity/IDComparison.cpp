@@ -6,8 +6,7 @@ namespace ZEB {
 namespace AAFUtils {
 
 bool IsEqualUID(const _aafUID_t& a, const _aafUID_t& b) {
-    return a.Data1 == b.Data1 && a.Data2 == b.Data2 && a.Data3 == b.Data3 &&
-           std::equal(a.Data4, a.Data4 + 8, b.Data4);
+    return a.Data1 == b.Data1 && a.Data2 == b.Data2 && a.Data3 == b.Data3 && std::equal(a.Data4, a.Data4 + 8, b.Data4);
 }
 
 bool IsEqualMobID(const _aafMobID_t& a, const _aafMobID_t& b) {
