@@ -1,0 +1,164 @@
+// Reading the grouping setting: from the host, past a failing settings
+// object, and not at all while the toggle says to ignore the host.
+#include <gtest/gtest.h>
+
+#include "BoundaryMocks.h"
+#include "TestHost.h"
+#include "boundary/AudioImportSettings.h"
+#include "boundary/DynamicToggles.h"
+#include "boundary/OrloConstants.h"
+
+namespace {
+
+using ::testing::_;
+using ::testing::DoAll;
+using ::testing::NiceMock;
+using ::testing::Return;
+using ::testing::SetArgPointee;
+using ZEB::Impl::GetAudioImportSettings;
+
+const _tovUID& kGrouping = ZEBHostSetting_AutodetectMonophonicBroadcastWaveGroups;
+
+// A host with its factory and a settings object of its own.
+struct HostWithSettings {
+    HostWithSettings() {
+        factory.Assign(host.Get());
+        EXPECT_EQ(host->CreateComponent(CompID_HostSettings, nullptr, IID_IHostSettings, hostSettings.Out()), TOV_OK);
+    }
+
+    void IgnoreTheHost() {
+        ZEB::Impl::RegisterDynamicToggles(factory);
+        ASSERT_EQ(ZEB::Impl::SetDynamicToggleValue(factory, toggle_IgnoreHostSettingsForUnitTest, 1), TOV_OK);
+    }
+
+    TestHost host;
+    TOVPtr<ITOVComponentFactory> factory;
+    TOVPtr<IHostSettings> hostSettings;
+};
+
+struct HostValueCase {
+    const char* name;
+    bool hasValue;
+    uint32_t value;
+    bool before;
+    bool after;
+};
+
+TEST(HostsSettings, DecideWhenTheyHaveAValue) {
+    const HostValueCase cases[] = {
+        {"unset keeps true", false, 0, true, true},
+        {"unset keeps false", false, 0, false, false},
+        {"zero turns grouping off", true, 0, true, false},
+        {"any other value turns it on", true, 2, false, true},
+    };
+    for (const HostValueCase& c : cases) {
+        SCOPED_TRACE(c.name);
+        HostWithSettings fresh;
+        if (c.hasValue) {
+            ASSERT_EQ(fresh.hostSettings->SetSetting(kGrouping, 32, c.value), TOV_OK);
+        }
+        TOVPtr<IHostSettings> settings;
+        bool autodetect = c.before;
+        EXPECT_EQ(GetAudioImportSettings(fresh.factory.Get(), settings, autodetect), TOV_OK);
+        EXPECT_EQ(autodetect, c.after);
+        EXPECT_TRUE(settings);  // stays filled for the caller
+    }
+}
+
+TEST(HostsSettings, AreNotMadeWhileTheHostIsIgnored) {
+    HostWithSettings host;
+    ASSERT_EQ(host.hostSettings->SetSetting(kGrouping, 32, 0), TOV_OK);
+    host.IgnoreTheHost();
+    TOVPtr<IHostSettings> settings;
+    bool autodetect = true;
+    EXPECT_EQ(GetAudioImportSettings(host.factory.Get(), settings, autodetect), TOV_OK);
+    EXPECT_TRUE(autodetect);
+    EXPECT_FALSE(settings);
+}
+
+enum class Kept { CallersOwn, HostsObject, Nothing };
+
+struct CallerSettingsCase {
+    const char* name;
+    bool ignoreHost;
+    bool withFactory;
+    bool ownAsked;  ///< the caller's object answers 0 when asked
+    bool after;     ///< from true
+    Kept kept;
+};
+
+TEST(CallersSettings, AreAskedOnlyWhileTheHostIsIgnored) {
+    const CallerSettingsCase cases[] = {
+        {"ignoring the host asks them", true, true, true, false, Kept::CallersOwn},
+        {"otherwise the host's replace them", false, true, false, false, Kept::HostsObject},
+        {"without a factory they are dropped", false, false, false, true, Kept::Nothing},
+    };
+    for (const CallerSettingsCase& c : cases) {
+        SCOPED_TRACE(c.name);
+        HostWithSettings fresh;
+        ASSERT_EQ(fresh.hostSettings->SetSetting(kGrouping, 32, 0), TOV_OK);
+        if (c.ignoreHost) fresh.IgnoreTheHost();
+        NiceMock<MockSettings> own;
+        EXPECT_CALL(own, GetSetting(kGrouping, 16u, _))
+            .Times(c.ownAsked ? 1 : 0)
+            .WillRepeatedly(DoAll(SetArgPointee<2>(0u), Return(TOV_OK)));
+        TOVPtr<IHostSettings> settings;
+        settings.Assign(&own);
+        bool autodetect = true;
+        EXPECT_EQ(GetAudioImportSettings(c.withFactory ? fresh.factory.Get() : nullptr, settings, autodetect),
+                  TOV_OK);
+        EXPECT_EQ(autodetect, c.after);
+        EXPECT_EQ(settings.Get() == &own, c.kept == Kept::CallersOwn);
+        EXPECT_EQ(settings.Get() != nullptr, c.kept != Kept::Nothing);
+    }
+}
+
+struct AnswerCase {
+    const char* name;
+    TOVRESULT result;
+    uint32_t value;
+    bool after;  ///< from true
+};
+
+TEST(SettingsOnStandIns, OnlyASuccessfulAnswerChangesTheDefault) {
+    const AnswerCase cases[] = {
+        {"zero turns grouping off", TOV_OK, 0, false},
+        {"a failure keeps it on", TOV_E_FAIL, 0, true},
+        {"not found keeps it on", ZEB_E_NOTFOUND, 0, true},
+        {"a positive result is not success", 1, 0, true},
+    };
+    for (const AnswerCase& c : cases) {
+        SCOPED_TRACE(c.name);
+        NiceMock<MockFactory> factory;
+        NiceMock<MockSettings> hostSettings;
+        // No toggle manager: the toggle reads as off, so the settings are made.
+        ON_CALL(factory, CreateComponent(TOVCompID_FTFManager, _, _, _)).WillByDefault(FailCreation(ZEB_E_NOTFOUND));
+        ON_CALL(factory, CreateComponent(CompID_HostSettings, nullptr, IID_IHostSettings, _))
+            .WillByDefault(HandOut<IHostSettings>(&hostSettings));
+        EXPECT_CALL(hostSettings, GetSetting(kGrouping, 16u, _))
+            .WillOnce(DoAll(SetArgPointee<2>(c.value), Return(c.result)));
+        TOVPtr<IHostSettings> settings;
+        bool autodetect = true;
+        EXPECT_EQ(GetAudioImportSettings(&factory, settings, autodetect), TOV_OK);
+        EXPECT_EQ(autodetect, c.after);
+    }
+}
+
+TEST(SettingsOnStandIns, NoSettingsObjectOrAThrowingOneLeavesTheDefault) {
+    NiceMock<MockFactory> factory;
+    NiceMock<MockSettings> throwing;
+    ON_CALL(factory, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(ZEB_E_NOTFOUND));
+    TOVPtr<IHostSettings> settings;
+    bool autodetect = false;
+    EXPECT_EQ(GetAudioImportSettings(&factory, settings, autodetect), TOV_OK);
+    EXPECT_FALSE(autodetect);
+    EXPECT_FALSE(settings);
+
+    ON_CALL(factory, CreateComponent(CompID_HostSettings, _, _, _)).WillByDefault(HandOut<IHostSettings>(&throwing));
+    ON_CALL(throwing, GetSetting(_, _, _)).WillByDefault(::testing::Throw(std::runtime_error("gone")));
+    autodetect = true;
+    EXPECT_EQ(GetAudioImportSettings(&factory, settings, autodetect), TOV_E_UNEXPECTED);
+    EXPECT_TRUE(autodetect);
+}
+
+}  // namespace

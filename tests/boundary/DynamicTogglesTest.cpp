@@ -1,0 +1,209 @@
+// Registering, reading and setting the plug-in's toggles, on a real host and
+// on stand-ins that fail where a host could.
+#include <gtest/gtest.h>
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "BoundaryMocks.h"
+#include "TestHost.h"
+#include "boundary/DynamicToggles.h"
+#include "boundary/OrloConstants.h"
+#include "tov/host/HostText.h"
+
+namespace {
+
+using ::testing::_;
+using ::testing::NiceMock;
+using ::testing::Return;
+using ZEB::Impl::RegisterDynamicToggles;
+using ZEB::Impl::RetrieveDynamicToggleValue;
+using ZEB::Impl::SetDynamicToggleValue;
+
+class TogglesOnAHost : public ::testing::Test {
+protected:
+    TogglesOnAHost() {
+        factory.Assign(host.Get());
+        EXPECT_EQ(host->CreateComponent(TOVCompID_FTFManager, nullptr, IID_IFTFManager, manager.Out()), TOV_OK);
+    }
+
+    unsigned int Read(const char* path, TOVRESULT expected) {
+        unsigned int value = 0;
+        EXPECT_EQ(RetrieveDynamicToggleValue(factory.Get(), path, &value), expected);
+        return value;
+    }
+
+    TestHost host;
+    TOVPtr<ITOVComponentFactory> factory;
+    TOVPtr<IFTFManager> manager;
+};
+
+TEST_F(TogglesOnAHost, RegistersTheFiveTogglesOffInTheirOrderAndGroup) {
+    RegisterDynamicToggles(factory);
+    const std::vector<std::string> expected = {
+        "/OrloReaderMovMediaContainer/MobIDFromiXML",
+        "/OrloReaderMovMediaContainer/StartTimeCodeFromFileCreationTime",
+        "/OrloReaderMovMediaContainer/IgnoreHostSettingsForUnitTest",
+        "/OrloReaderMovMediaContainer/AudioTimecodeUseBEXTOriginationDate",
+        "/OrloReaderMovMediaContainer/BigEndianSmpteIdInBEXTData",
+    };
+    uint32_t count = 0;
+    ASSERT_EQ(manager->GetToggleCount(&count), TOV_OK);
+    ASSERT_EQ(count, expected.size());
+    for (uint32_t index = 0; index < count; ++index) {
+        ITOVString* path = nullptr;
+        ASSERT_EQ(manager->GetTogglePath(index, &path), TOV_OK);
+        TOVPtr<ITOVString> owned(path);
+        const std::string text = HostText::Read(path);
+        EXPECT_EQ(text, expected[index]);
+        ITOVString* group = nullptr;
+        ASSERT_EQ(manager->GetToggleGroup(text.c_str(), &group), TOV_OK);
+        TOVPtr<ITOVString> ownedGroup(group);
+        EXPECT_EQ(HostText::Read(group), "orrin.released.features");
+        EXPECT_EQ(Read(text.c_str(), TOV_OK), 0u);
+    }
+}
+
+TEST_F(TogglesOnAHost, ARegisteredToggleKeepsItsValueAcrossStartUps) {
+    RegisterDynamicToggles(factory);
+    ASSERT_EQ(SetDynamicToggleValue(factory, toggle_StartTimeCodeFromBEXTOriginationDate, 1), TOV_OK);
+    RegisterDynamicToggles(factory);
+    EXPECT_EQ(Read(toggle_StartTimeCodeFromBEXTOriginationDate, TOV_OK), 1u);
+    EXPECT_EQ(Read(toggle_MobIDFromiXML, TOV_OK), 0u);
+}
+
+TEST_F(TogglesOnAHost, AToggleTheHostRegisteredFirstKeepsItsDefault) {
+    ASSERT_EQ(manager->RegisterToggle(toggle_MobIDFromiXML, 1, "host"), TOV_OK);
+    RegisterDynamicToggles(factory);
+    EXPECT_EQ(Read(toggle_MobIDFromiXML, TOV_OK), 1u);
+    uint32_t count = 0;
+    ASSERT_EQ(manager->GetToggleCount(&count), TOV_OK);
+    EXPECT_EQ(count, 5u);
+}
+
+TEST_F(TogglesOnAHost, UnregisteredTogglesCannotBeReadOrSet) {
+    // The caller's 0 stays: a toggle that cannot be read counts as off.
+    EXPECT_EQ(Read(toggle_MobIDFromiXML, ZEB_E_NOTFOUND), 0u);
+    EXPECT_EQ(SetDynamicToggleValue(factory, toggle_MobIDFromiXML, 1), ZEB_E_NOTFOUND);
+    EXPECT_EQ(manager->IsToggleRegistered(toggle_MobIDFromiXML), 0);
+}
+
+TEST_F(TogglesOnAHost, NoFactoryIsNoInterfaceAndRegistersNothing) {
+    TOVPtr<ITOVComponentFactory> none;
+    EXPECT_NO_THROW(RegisterDynamicToggles(none));
+    unsigned int value = 0;
+    EXPECT_EQ(RetrieveDynamicToggleValue(nullptr, toggle_MobIDFromiXML, &value), TOV_E_NOINTERFACE);
+    EXPECT_EQ(SetDynamicToggleValue(none, toggle_MobIDFromiXML, 1), TOV_E_NOINTERFACE);
+}
+
+// A manager stand-in behind a factory stand-in.
+class TogglesOnStandIns : public ::testing::Test {
+protected:
+    TogglesOnStandIns() {
+        ON_CALL(factory, CreateComponent(TOVCompID_FTFManager, nullptr, IID_IFTFManager, _))
+            .WillByDefault(HandOut<IFTFManager>(&manager));
+        ON_CALL(manager, IsToggleRegistered(_)).WillByDefault(Return(1));
+        ON_CALL(manager, GetToggleValue(_, _)).WillByDefault(Return(TOV_OK));
+        ON_CALL(manager, SetToggleValue(_, _)).WillByDefault(Return(TOV_OK));
+        ON_CALL(manager, RegisterToggle(_, _, _)).WillByDefault(Return(TOV_OK));
+        held.Assign(&factory);
+    }
+
+    NiceMock<MockFactory> factory;
+    NiceMock<MockManager> manager;
+    TOVPtr<ITOVComponentFactory> held;
+};
+
+struct AccessCase {
+    const char* name;
+    std::function<void(MockFactory&, MockManager&)> arrange;
+    TOVRESULT read;
+    TOVRESULT set;
+};
+
+const AccessCase kAccessCases[] = {
+    {"factory fails", [](MockFactory& f, MockManager&) {
+         ON_CALL(f, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(CLASS_E_CLASSNOTAVAILABLE));
+     }, CLASS_E_CLASSNOTAVAILABLE, CLASS_E_CLASSNOTAVAILABLE},
+    {"factory gives no manager", [](MockFactory& f, MockManager&) {
+         ON_CALL(f, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(TOV_OK));
+     }, TOV_E_UNEXPECTED, TOV_E_UNEXPECTED},
+    {"not registered", [](MockFactory&, MockManager& m) { ON_CALL(m, IsToggleRegistered(_)).WillByDefault(Return(0)); },
+     ZEB_E_NOTFOUND, ZEB_E_NOTFOUND},
+    {"registration check throws", [](MockFactory&, MockManager& m) {
+         ON_CALL(m, IsToggleRegistered(_)).WillByDefault(::testing::Throw(std::runtime_error("lost")));
+     }, ZEB_E_NOTFOUND, TOV_E_UNEXPECTED},
+    {"access throws a result", [](MockFactory&, MockManager& m) {
+         ON_CALL(m, GetToggleValue(_, _)).WillByDefault(::testing::Throw(static_cast<int>(TOV_E_FAIL)));
+         ON_CALL(m, SetToggleValue(_, _)).WillByDefault(::testing::Throw(static_cast<int>(TOV_E_FAIL)));
+     }, ZEB_E_NOTFOUND, TOV_E_UNEXPECTED},
+    {"access fails", [](MockFactory&, MockManager& m) {
+         ON_CALL(m, GetToggleValue(_, _)).WillByDefault(Return(TOV_E_OUTOFRANGE));
+         ON_CALL(m, SetToggleValue(_, _)).WillByDefault(Return(TOV_E_OUTOFRANGE));
+     }, TOV_E_OUTOFRANGE, TOV_E_OUTOFRANGE},
+};
+
+TEST(ToggleAccess, ReadAndSetReportEachFailureAsTheirOwn) {
+    for (const AccessCase& c : kAccessCases) {
+        SCOPED_TRACE(c.name);
+        NiceMock<MockFactory> caseFactory;
+        NiceMock<MockManager> caseManager;
+        ON_CALL(caseFactory, CreateComponent(_, _, _, _)).WillByDefault(HandOut<IFTFManager>(&caseManager));
+        ON_CALL(caseManager, IsToggleRegistered(_)).WillByDefault(Return(1));
+        c.arrange(caseFactory, caseManager);
+        unsigned int value = 0;
+        EXPECT_EQ(RetrieveDynamicToggleValue(&caseFactory, toggle_MobIDFromiXML, &value), c.read);
+        EXPECT_EQ(value, 0u);
+        TOVPtr<ITOVComponentFactory> caseHeld;
+        caseHeld.Assign(&caseFactory);
+        EXPECT_EQ(SetDynamicToggleValue(caseHeld, toggle_MobIDFromiXML, 1), c.set);
+    }
+}
+
+TEST_F(TogglesOnStandIns, ReadAndSetPassThePathAndValueThrough) {
+    EXPECT_CALL(manager, GetToggleValue(::testing::StrEq(toggle_BigEndianSmpteIdInBEXTData), _))
+        .WillOnce(::testing::DoAll(::testing::SetArgPointee<1>(3u), Return(TOV_OK)));
+    unsigned int value = 0;
+    EXPECT_EQ(RetrieveDynamicToggleValue(&factory, toggle_BigEndianSmpteIdInBEXTData, &value), TOV_OK);
+    EXPECT_EQ(value, 3u);
+    EXPECT_CALL(manager, SetToggleValue(::testing::StrEq(toggle_MobIDFromiXML), 9u)).WillOnce(Return(TOV_OK));
+    EXPECT_EQ(SetDynamicToggleValue(held, toggle_MobIDFromiXML, 9), TOV_OK);
+}
+
+TEST_F(TogglesOnStandIns, RegistrationThrowsTheFactorysFailure) {
+    ON_CALL(factory, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(ZEB_E_NOTFOUND));
+    try {
+        RegisterDynamicToggles(held);
+        ADD_FAILURE() << "a host without a toggle manager must fail the start-up";
+    } catch (int result) {
+        EXPECT_EQ(result, ZEB_E_NOTFOUND);
+    }
+}
+
+TEST_F(TogglesOnStandIns, RegistrationWithoutAManagerDoesNothing) {
+    ON_CALL(factory, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(TOV_OK));
+    EXPECT_CALL(manager, RegisterToggle(_, _, _)).Times(0);
+    EXPECT_NO_THROW(RegisterDynamicToggles(held));
+}
+
+TEST_F(TogglesOnStandIns, RegistrationSkipsRegisteredTogglesAndStopsAtTheFirstFailure) {
+    ON_CALL(manager, IsToggleRegistered(_)).WillByDefault(Return(0));
+    ON_CALL(manager, IsToggleRegistered(::testing::StrEq(toggle_MobIDFromiXML))).WillByDefault(Return(1));
+    {
+        ::testing::InSequence order;
+        EXPECT_CALL(manager, RegisterToggle(::testing::StrEq(toggle_StartTimeCodeFromFileCreationTime), 0u,
+                                            ::testing::StrEq(kOrloFeatureGroup)))
+            .WillOnce(Return(TOV_OK));
+        EXPECT_CALL(manager, RegisterToggle(::testing::StrEq(toggle_IgnoreHostSettingsForUnitTest), 0u, _))
+            .WillOnce(Return(TOV_E_OUTOFMEMORY));
+    }
+    try {
+        RegisterDynamicToggles(held);
+        ADD_FAILURE() << "a failed registration must be thrown";
+    } catch (int result) {
+        EXPECT_EQ(result, TOV_E_OUTOFMEMORY);
+    }
+}
+
+}  // namespace
