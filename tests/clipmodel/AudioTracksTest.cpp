@@ -1,0 +1,171 @@
+// How a file's channels become tracks: the iXML track list when it describes
+// every channel, the plain channel order otherwise, and the media of each.
+#include <stdexcept>
+#include <string>
+
+#include "ClipTest.h"
+
+namespace {
+
+using OrloReader::Movie;
+
+std::string Track(int channel, int interleave, const std::string& name) {
+    return "<TRACK><CHANNEL_INDEX>" + std::to_string(channel) + "</CHANNEL_INDEX><INTERLEAVE_INDEX>" +
+           std::to_string(interleave) + "</INTERLEAVE_INDEX><NAME>" + name + "</NAME></TRACK>";
+}
+
+struct TrackCase {
+    const char* name;
+    uint16_t channels;
+    std::string trackList;  // the TRACK_LIST's content; empty for none
+    std::vector<int> channelIndices;
+    std::vector<std::pair<std::string, std::string>> trks;
+};
+
+class TrackRoutes : public ClipTest, public ::testing::WithParamInterface<TrackCase> {};
+
+TEST_P(TrackRoutes, GiveChannelIndicesAndNames) {
+    const TrackCase& c = GetParam();
+    ClipFile file;
+    file.channels = c.channels;
+    if (!c.trackList.empty()) file.ixml = Ixml("<TRACK_LIST>" + c.trackList + "</TRACK_LIST>");
+    const Movie movie = LoadFile(file);
+    ASSERT_EQ(movie.GetTrackCount(), c.channelIndices.size() + 1);
+    for (size_t i = 0; i < c.channelIndices.size(); ++i)
+        EXPECT_EQ(movie.GetTrack(static_cast<unsigned>(i + 1))->GetChannelIndex(), c.channelIndices[i]) << i;
+    std::vector<std::pair<std::string, std::string>> trks(movie.GetMovieTRKs().begin(), movie.GetMovieTRKs().end());
+    EXPECT_EQ(trks, c.trks);
+    EXPECT_EQ(movie.HasMovieTRKs(), !c.trks.empty());
+    EXPECT_EQ(movie.IsMonoAudio(), c.channels == 1);
+}
+
+const TrackCase kTrackCases[] = {
+    {"NoTrackList", 2, "", {0, 1}, {}},
+    {"MonoWithOneEntry", 1, Track(2, 1, "Boom"), {2}, {{"TRK1", "Boom"}}},
+    // Sorted by interleave index: the first track is the entry of index 1.
+    {"SortedByInterleaveIndex",
+     2,
+     Track(1, 2, "Lav") + Track(2, 1, "Boom"),
+     {2, 1},
+     {{"TRK1", "Boom"}, {"TRK2", "Lav"}}},
+    {"CountGivenMatches",
+     2,
+     "<TRACK_COUNT>2</TRACK_COUNT>" + Track(1, 1, "A") + Track(2, 2, "B"),
+     {1, 2},
+     {{"TRK1", "A"}, {"TRK2", "B"}}},
+    // TRACK_COUNT 3 with three entries on a stereo file: only two tracks.
+    {"CountAboveChannels",
+     2,
+     "<TRACK_COUNT>3</TRACK_COUNT>" + Track(1, 1, "A") + Track(2, 2, "B") + Track(3, 3, "C"),
+     {1, 2},
+     {{"TRK1", "A"}, {"TRK2", "B"}}},
+    // A count below the channels leaves the rest at their own index, unnamed.
+    {"CountBelowChannels", 3, "<TRACK_COUNT>1</TRACK_COUNT>" + Track(5, 1, "A"), {5, 1, 2}, {{"TRK1", "A"}}},
+    {"LengthDiffersFromChannels", 2, Track(1, 1, "A"), {0, 1}, {}},
+    {"EntryWithoutInterleaveIgnoresList",
+     2,
+     Track(1, 1, "A") + "<TRACK><CHANNEL_INDEX>2</CHANNEL_INDEX><NAME>B</NAME></TRACK>",
+     {0, 1},
+     {}},
+    // The channel index is cut to 8 bits.
+    {"ChannelIndexCutTo8Bits", 1, Track(300, 1, "X"), {44}, {{"TRK1", "X"}}},
+    {"EntryWithoutNameGivesEmptyName",
+     1,
+     "<TRACK><CHANNEL_INDEX>1</CHANNEL_INDEX><INTERLEAVE_INDEX>1</INTERLEAVE_INDEX></TRACK>",
+     {1},
+     {{"TRK1", ""}}},
+};
+INSTANTIATE_TEST_SUITE_P(Routes, TrackRoutes, ::testing::ValuesIn(kTrackCases),
+                         [](const auto& info) { return std::string(info.param.name); });
+
+TEST_F(ClipTest, BextTrkKeywordsNeverReachTheMovie) {
+    ClipFile file;
+    file.bext = BextWith("sTRK1=Boom\r\nsTRK2=Lav\r\nsTRKA=Plant\r\n");
+    const Movie movie = LoadFile(file);
+    EXPECT_TRUE(movie.GetMovieTRKs().empty());
+    EXPECT_FALSE(movie.HasMovieTRKs());
+}
+
+TEST_F(ClipTest, TracksShareTheFilesLayout) {
+    ClipFile file;
+    file.frames = 10;
+    const Movie movie = LoadFile(file);
+    ASSERT_EQ(movie.GetTrackCount(), 3u);
+    // RIFF header 12, fmt 8 + 16, data header 8: samples start at 44.
+    const uint64_t starts[] = {44, 47};
+    for (unsigned i = 1; i <= 2; ++i) {
+        const auto media = movie.GetTrack(i)->GetMedia();
+        const auto descriptor = media->GetSoundDescriptor();
+        ASSERT_NE(descriptor, nullptr);
+        EXPECT_EQ(descriptor->GetStartOffset(), starts[i - 1]);
+        EXPECT_EQ(descriptor->GetBytesPerPacket(), 6u);
+        EXPECT_EQ(descriptor->GetBytesPerFrame(), 6u);
+        EXPECT_EQ(descriptor->GetChannelsPerFrame(), 2u);
+        EXPECT_EQ(descriptor->GetBitsPerChannel(), 24u);
+        EXPECT_EQ(descriptor->GetSampleRate(), 48000.0);
+        EXPECT_FALSE(descriptor->IsBigEndian());
+        EXPECT_FALSE(descriptor->IsFloatingPoint());
+        EXPECT_EQ(media->GetSampleCount(), 10u);
+        EXPECT_EQ(media->GetSampleSize(0), 6u);
+        EXPECT_EQ(media->GetSampleOffset(3), starts[i - 1] + 18);
+        EXPECT_EQ(media->GetNumberOfContiguousSamples(4), 6u);
+        EXPECT_EQ(media->GetNumberOfContiguousSamples(11), 0u);
+    }
+    const auto timecode = movie.GetTrack(0)->GetMedia();
+    EXPECT_EQ(timecode->GetSoundDescriptor(), nullptr);
+    EXPECT_EQ(timecode->GetSampleSize(0), 0u);
+    EXPECT_EQ(timecode->GetSampleOffset(5), 0u);
+    EXPECT_THROW(movie.GetTrack(3), std::logic_error);
+}
+
+TEST(MediaSync, EveryFortySecondSampleIsSync) {
+    const OrloReader::Media media(OrloReader::kMediaTypeAudio);
+    EXPECT_FALSE(media.IsNotSync(84));
+    EXPECT_TRUE(media.IsNotSync(85));
+    EXPECT_FALSE(media.IsNotSync(0));
+}
+
+TEST(MediaStart, CountsFramesWithTwoDroppedAMinuteInDrop) {
+    const struct {
+        OrloReader::TimeCodeInfo start;
+        long long frames;
+    } cases[] = {
+        {{1, 0, 0, 0, 25, false}, 90000},
+        {{0, 1, 0, 2, 30, true}, 1800},
+        {{0, 10, 0, 0, 30, true}, 17982},
+        {{1, 0, 0, 0, 30, true}, 107892},
+        // The drop count stays two at 60 as well.
+        {{0, 1, 0, 0, 60, true}, 3598},
+    };
+    for (const auto& c : cases) {
+        OrloReader::Media media(OrloReader::kMediaTypeTimecode);
+        media.SetStartTimeCode(c.start);
+        long long frames = 0;
+        unsigned short fps = 0;
+        bool drop = false;
+        media.GetStartTimeCode(frames, fps, drop);
+        EXPECT_EQ(frames, c.frames);
+        EXPECT_EQ(fps, c.start.GetFPS());
+        EXPECT_EQ(drop, c.start.IsDropFrame());
+    }
+}
+
+TEST(MovieRecord, InitializeClearsFlagsAndCounts) {
+    OrloReader::Movie movie;
+    EXPECT_EQ(movie.GetMovieEditRate().denominator, 1);
+    EXPECT_EQ(movie.GetStartingTrackIndex(), 1);
+    EXPECT_EQ(movie.GetMovieTimeCode().GetTotalFrames(), -1);
+    movie.SetHasMovieScene(true);
+    movie.SetHasTapeMobRate(true);
+    movie.SetMovieDigitizerRate(48048);
+    movie.SetMovieGroupLength(7);
+    movie.SetIsMonoAudio(true);
+    movie.Initialize();
+    EXPECT_FALSE(movie.HasMovieScene());
+    EXPECT_FALSE(movie.HasTapeMobEditRate());
+    EXPECT_EQ(movie.GetMovieDigitizerRate(), 0u);
+    EXPECT_EQ(movie.GetMovieGroupLength(), 0);
+    EXPECT_TRUE(movie.IsMonoAudio());
+}
+
+}  // namespace

@@ -1,0 +1,182 @@
+// The clip's identity: the four routes in their order, and the digest's
+// samples of the file, which make the identity independent of the folder.
+#include <cstring>
+#include <string>
+#include <vector>
+
+#include "ClipTest.h"
+#include "boundary/OrloConstants.h"
+#include "clipmodel/MobIDFromMetadata.h"
+#include "identity/GetMobIDFromString.h"
+
+namespace {
+
+using OrloReader::Movie;
+
+const unsigned char kHead[16] = {0x06, 0x0A, 0x2B, 0x34, 0x01, 0x01, 0x01, 0x01,
+                                 0x01, 0x01, 0x0F, 0x00, 0x13, 0x00, 0x00, 0x00};
+
+std::string Head(const _aafMobID_t& id) { return std::string(reinterpret_cast<const char*>(&id), 16); }
+std::string Material(const _aafMobID_t& id) { return std::string(reinterpret_cast<const char*>(&id.material), 16); }
+std::string HeadBytes() { return std::string(reinterpret_cast<const char*>(kHead), 16); }
+
+// A SMPTE UMID as a recorder writes it: label, length, instance, and a
+// material number whose fields are big-endian.
+std::string BextUmid() {
+    std::string umid = HeadBytes();
+    umid[13] = 0x11;  // instance high
+    umid[15] = 0x33;  // instance low
+    const unsigned char material[16] = {0x01, 0x02, 0x03, 0x04, 0x05, 0x06, 0x07, 0x08,
+                                        0x09, 0x0A, 0x0B, 0x0C, 0x0D, 0x0E, 0x0F, 0x10};
+    umid.append(reinterpret_cast<const char*>(material), 16);
+    return umid + std::string(32, '\x55');
+}
+
+TEST_F(ClipTest, BextUmidFieldsAreTurnedAroundUnlessToggled) {
+    ClipFile file;
+    file.bext = BextWith("");
+    file.bext->umid = BextUmid();
+    // The digits are read back as numbers, then each field's bytes are turned around.
+    _aafMobID_t id = LoadFile(file).GetMobID();
+    EXPECT_EQ(id.material.Data1, 0x04030201u);
+    EXPECT_EQ(id.material.Data2, 0x0605u);
+    EXPECT_EQ(id.material.Data3, 0x0807u);
+    EXPECT_EQ(id.material.Data4[0], 0x09);
+    EXPECT_EQ(id.material.Data4[7], 0x10);
+    EXPECT_EQ(id.instanceHigh, 0x33);
+    EXPECT_EQ(id.instanceLow, 0x11);
+    EXPECT_EQ(std::string(reinterpret_cast<const char*>(&id), 12), HeadBytes().substr(0, 12));
+
+    SetToggle(toggle_BigEndianSmpteIdInBEXTData, 1);
+    id = LoadFile(file).GetMobID();
+    EXPECT_EQ(id.material.Data1, 0x01020304u);
+    EXPECT_EQ(id.material.Data2, 0x0506u);
+    EXPECT_EQ(id.material.Data3, 0x0708u);
+    EXPECT_EQ(id.instanceHigh, 0x11);
+    EXPECT_EQ(id.instanceLow, 0x33);
+}
+
+TEST_F(ClipTest, RoutesAreTriedInOrderOfTrust) {
+    const std::string umidChunk = std::string(3, '\x01') + std::string(16, '\x42') + std::string(5, '\0');
+    const std::string fileUid = "RCD2024051713451000000001ABCDEFGHIJK";  // 36 characters
+
+    ClipFile file;
+    file.bext = BextWith("");
+    file.bext->umid = BextUmid();
+    file.umid = umidChunk;
+    file.ixml = Ixml("<FILE_UID>" + fileUid + "</FILE_UID>");
+
+    // bext first while the iXML toggle is off.
+    EXPECT_EQ(LoadFile(file).GetMobID().material.Data1, 0x04030201u);
+
+    // The iXML route takes the first 32 characters themselves as the 32 bytes.
+    SetToggle(toggle_MobIDFromiXML, 1);
+    _aafMobID_t id = LoadFile(file).GetMobID();
+    EXPECT_EQ(std::string(reinterpret_cast<const char*>(&id), 32), fileUid.substr(0, 32));
+
+    // 31 characters are too few: back to bext.
+    file.ixml = Ixml("<FILE_UID>" + fileUid.substr(0, 31) + "</FILE_UID>");
+    EXPECT_EQ(LoadFile(file).GetMobID().material.Data1, 0x04030201u);
+
+    // Version 0 has no UMID, whatever the bytes say: the umid chunk is next.
+    file.bext->version = 0;
+    id = LoadFile(file).GetMobID();
+    EXPECT_EQ(Material(id), std::string(16, '\x42'));
+    EXPECT_EQ(Head(id), HeadBytes());
+}
+
+TEST_F(ClipTest, ZeroUmidMaterialFallsThroughLeavingItsHead) {
+    // The first 32 bytes are zero, the rest not: the 64 are compared as a
+    // whole, so the route runs, finds a zero material and fails.
+    ClipFile file;
+    file.bext = BextWith("");
+    file.bext->umid = std::string(32, '\0') + std::string(32, '\x7F');
+    file.umid = std::string(3, '\x01') + std::string(16, '\x42') + std::string(5, '\0');
+    const _aafMobID_t id = LoadFile(file).GetMobID();
+    EXPECT_EQ(Material(id), std::string(16, '\x42'));
+    EXPECT_EQ(Head(id), std::string(16, '\0'));  // what the failed route left behind
+}
+
+TEST_F(ClipTest, DigestIdentityFollowsContentAndNameNotFolder) {
+    const std::string bytes = ClipFile{}.Bytes();
+    Movie first, moved, renamed;
+    ASSERT_EQ(Load(Write("day1/take.wav", bytes), first), TOV_OK);
+    ASSERT_EQ(Load(Write("day2/take.wav", bytes), moved), TOV_OK);
+    ASSERT_EQ(Load(Write("day1/other.wav", bytes), renamed), TOV_OK);
+    EXPECT_EQ(Head(first.GetMobID()), HeadBytes());
+    EXPECT_TRUE(OrloReader::IsMobIdMaterialValid(first.GetMobID().material));
+    EXPECT_EQ(first.GetMobID(), moved.GetMobID());
+    EXPECT_NE(first.GetMobID(), renamed.GetMobID());
+}
+
+TEST_F(ClipTest, DigestSamplesOnlyThreeBlocks) {
+    // Two files alike in the first, middle and last blocks, different between.
+    ClipFile file;
+    file.frames = 20000;  // 120000 sample bytes: blocks of 4096
+    std::string a = file.Bytes();
+    std::string b = a;
+    b[20000] ^= 0x5A;
+    b[90000] ^= 0x5A;
+    Movie ma, mb;
+    ASSERT_EQ(Load(Write("a/take.wav", a), ma), TOV_OK);
+    ASSERT_EQ(Load(Write("b/take.wav", b), mb), TOV_OK);
+    EXPECT_EQ(ma.GetMobID(), mb.GetMobID());
+
+    b[a.size() / 2] ^= 0x5A;  // inside the middle block
+    Movie mc;
+    ASSERT_EQ(Load(Write("c/take.wav", b), mc), TOV_OK);
+    EXPECT_NE(ma.GetMobID(), mc.GetMobID());
+}
+
+TEST_F(ClipTest, BufferForHashBlockSizesAndPlaces) {
+    const struct {
+        size_t size, block;
+    } cases[] = {{200, 64}, {191, 64}, {12288, 4032}, {12289, 4096}, {1000000, 4096}};
+    for (const auto& c : cases) {
+        std::string bytes(c.size, '\0');
+        for (size_t i = 0; i < c.size; ++i) bytes[i] = static_cast<char>(i % 251);
+        const std::string path = Write("f" + std::to_string(c.size) + ".raw", bytes);
+        std::vector<unsigned char> buffer;
+        ASSERT_TRUE(OrloReader::GetBufferForHash(path, buffer)) << c.size;
+        const std::string name = "f" + std::to_string(c.size) + ".raw";
+        ASSERT_EQ(buffer.size(), 3 * c.block + name.size()) << c.size;
+        const long long middle = static_cast<long long>(c.block) + static_cast<long long>(c.size / 2) -
+                                 static_cast<long long>(3 * c.block / 2);
+        const std::string got(buffer.begin(), buffer.end());
+        EXPECT_EQ(got.substr(0, c.block), bytes.substr(0, c.block)) << c.size;
+        EXPECT_EQ(got.substr(c.block, c.block), bytes.substr(static_cast<size_t>(middle), c.block)) << c.size;
+        EXPECT_EQ(got.substr(2 * c.block, c.block), bytes.substr(c.size - c.block)) << c.size;
+        EXPECT_EQ(got.substr(3 * c.block), name) << c.size;
+    }
+    std::vector<unsigned char> buffer{1, 2, 3};
+    EXPECT_FALSE(OrloReader::GetBufferForHash(Write("tiny", std::string(63, 'x')), buffer));
+    EXPECT_TRUE(buffer.empty());
+    EXPECT_FALSE(OrloReader::GetBufferForHash(folder + "/missing", buffer));
+    EXPECT_FALSE(OrloReader::GetBufferForHash("", buffer));
+}
+
+TEST(MobIdMaterial, IsValidOnlyWithEveryFieldSet) {
+    _aafUID_t uid{1, 2, 3, {0, 0, 0, 0, 0, 0, 0, 1}};
+    EXPECT_TRUE(OrloReader::IsMobIdMaterialValid(uid));
+    for (int field = 0; field < 4; ++field) {
+        _aafUID_t broken = uid;
+        if (field == 0) broken.Data1 = 0;
+        if (field == 1) broken.Data2 = 0;
+        if (field == 2) broken.Data3 = 0;
+        if (field == 3) std::memset(broken.Data4, 0, 8);
+        EXPECT_FALSE(OrloReader::IsMobIdMaterialValid(broken)) << field;
+    }
+}
+
+TEST_F(ClipTest, AFileTooSmallToDigestHasNoIdentity) {
+    // fmt and an empty data chunk: 44 bytes, below one 64-byte block.
+    ClipFile file;
+    file.frames = 0;
+    Movie movie;
+    EXPECT_EQ(Load(Write("empty.wav", file.Bytes()), movie), TOV_E_NOTSUPPORTED);
+    // The same with a umid chunk takes its identity from there.
+    file.umid = std::string(3, '\x01') + std::string(16, '\x42') + std::string(5, '\0');
+    EXPECT_EQ(Load(Write("umid.wav", file.Bytes()), movie), TOV_OK);
+}
+
+}  // namespace
