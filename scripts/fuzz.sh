@@ -5,6 +5,7 @@
 # TARGET is fuzz_chunk_stream (default: the chunk walk) or fuzz_ixml (the iXML
 # text). Installs nothing. ORLO_FUZZ_BUILD names the build folder (default
 # build-fuzz). A crash leaves its input as crash-* in that folder.
+# fuzz_clip_text runs the clip model's text parsers on fuzz/clip-text-seeds.
 set -euo pipefail
 root=$(cd "$(dirname "$0")/.." && pwd)
 seconds=${1:-60}
@@ -14,7 +15,8 @@ dir="$root/${ORLO_FUZZ_BUILD:-build-fuzz}"
 case "$target" in
     fuzz_chunk_stream) seeds="$dir/fuzz/seeds" ;;
     fuzz_ixml) seeds="$root/fuzz/ixml-seeds" ;;
-    *) echo "fuzz.sh: unknown target $target (fuzz_chunk_stream or fuzz_ixml)" >&2; exit 2 ;;
+    fuzz_clip_text) seeds="$root/fuzz/clip-text-seeds" ;;
+    *) echo "fuzz.sh: unknown target $target (fuzz_chunk_stream, fuzz_ixml or fuzz_clip_text)" >&2; exit 2 ;;
 esac
 
 CC=clang CXX=clang++ cmake -S "$root" -B "$dir" -G Ninja -DORLO_FUZZ=ON -DORLO_TESTS=OFF -DORLO_BENCH=OFF >/dev/null

@@ -87,16 +87,6 @@ TEST_F(GenerateUMIDFromFileContent, AnEmptyFileIsTheDigestOfNothing) {
     EXPECT_EQ(out, FakeUIDOf(""));
 }
 
-TEST_F(GenerateUMIDFromFileContent, OnlyContentCounts) {
-    const std::string content = "the same bytes";
-    TempFile one(content), other(content);
-    _aafUID_t first{}, second{};
-    ASSERT_EQ(Generate(one.Path(), &first), TOV_OK);
-    ASSERT_EQ(Generate(other.Path(), &second), TOV_OK);
-    EXPECT_EQ(first, FakeUIDOf(content));
-    EXPECT_EQ(second, first) << "neither the name nor anything else enters the digest";
-}
-
 TEST_F(GenerateUMIDFromFileContent, TakesThePathInAnyEncoding) {
     TempFile file("wide");
     const std::string folder = file.Path().substr(0, file.Path().rfind('/') + 1);

@@ -35,11 +35,4 @@ TEST_F(StandardizePathInPlace, RewritesBackslashesInTheStringItself) {
     }
 }
 
-TEST_F(StandardizePathInPlace, AViewChangesTheViewedString) {
-    ZEBString owner(reinterpret_cast<const unsigned char*>("a\\b"));
-    ZEBString view(owner.InArg(), 0);
-    AAFUtils::StandardizePath(view);
-    EXPECT_EQ(std::wstring(owner.GetWCHARString()), L"a/b");
-}
-
 }  // namespace
