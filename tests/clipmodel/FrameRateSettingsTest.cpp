@@ -1,0 +1,67 @@
+// A frame rate's three ways in, and its drop-frame rule: the request holds
+// only when the rate rounded to whole frames can be drop frame.
+#include <gtest/gtest.h>
+
+#include <cmath>
+
+#include "clipmodel/FrameRateSettings.h"
+
+namespace {
+
+using OrloReader::FrameRateSettings;
+
+struct Case {
+    const char* name;
+    FrameRateSettings settings;
+    int numerator;
+    int denominator;
+    double fps;
+    bool drop;
+};
+
+TEST(FrameRateSettingsTest, EachWayInSetsRateFpsAndDrop) {
+    const Case cases[] = {
+        {"undecided", FrameRateSettings(), 0, 1, 0.0, false},
+        {"rational 29.97 drop", FrameRateSettings(_aafRational_t{30000, 1001}, true), 30000, 1001, 30000.0 / 1001, true},
+        {"rational 29.97 no drop", FrameRateSettings(_aafRational_t{30000, 1001}, false), 30000, 1001, 30000.0 / 1001,
+         false},
+        {"rational 60 drop", FrameRateSettings(_aafRational_t{60, 1}, true), 60, 1, 60.0, true},
+        {"rational 23.976 drop refused", FrameRateSettings(_aafRational_t{24000, 1001}, true), 24000, 1001,
+         24000.0 / 1001, false},
+        {"rational 25 drop refused", FrameRateSettings(_aafRational_t{25, 1}, true), 25, 1, 25.0, false},
+        {"floating 29.97 drop", FrameRateSettings(29.97, true), 30000, 1001, 29.97, true},
+        // The rate is 59.94 but the figure rounds to 59: no drop frame.
+        {"floating 59.4 drop refused", FrameRateSettings(59.4, true), 60000, 1001, 59.4, false},
+        {"floating 59.5 drop", FrameRateSettings(59.5, true), 60000, 1001, 59.5, true},
+        {"integer 30 drop", FrameRateSettings(30, true), 30, 1, 30.0, true},
+        // 29 is read as 29.97, which rounds to 30.
+        {"integer 29 drop", FrameRateSettings(29, true), 30000, 1001, 30000.0 / 1001, true},
+        {"integer 72", FrameRateSettings(72, true), 72, 1, 72.0, false},
+        {"denominator 0", FrameRateSettings(_aafRational_t{30, 0}, true), 30, 0, HUGE_VAL, false},
+    };
+    for (const Case& c : cases) {
+        SCOPED_TRACE(c.name);
+        const _aafRational_t rate = c.settings.GetRationalFramerate();
+        EXPECT_EQ(rate.numerator, c.numerator);
+        EXPECT_EQ(rate.denominator, c.denominator);
+        EXPECT_DOUBLE_EQ(c.settings.GetFloatingFrameRate(), c.fps);
+        EXPECT_EQ(c.settings.GetDropFrame(), c.drop);
+    }
+}
+
+TEST(FrameRateSettingsTest, SettersReplaceEverythingAndSetDropFrameStandsAlone) {
+    FrameRateSettings settings(_aafRational_t{30000, 1001}, true);
+    settings.SetFloatingFramerate(25.0, true);
+    EXPECT_EQ(settings.GetRationalFramerate().numerator, 25);
+    EXPECT_FALSE(settings.GetDropFrame());
+    settings.SetDropFrame(true);
+    EXPECT_TRUE(settings.GetDropFrame());
+    settings.SetIntegerFramerate(60, false);
+    EXPECT_EQ(settings.GetRationalFramerate().numerator, 60);
+    EXPECT_FALSE(settings.GetDropFrame());
+    settings.SetRationalFramerate(_aafRational_t{60000, 1001}, true);
+    EXPECT_DOUBLE_EQ(settings.GetFloatingFrameRate(), 60000.0 / 1001);
+    EXPECT_TRUE(settings.GetDropFrame());
+}
+
+}  // namespace

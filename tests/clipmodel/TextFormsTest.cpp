@@ -1,0 +1,126 @@
+// The diagnostic text forms, with the orders they keep, and the parses and
+// conversions between timecode forms.
+#include <gtest/gtest.h>
+
+#include <climits>
+
+#include "StartedLibraryTest.h"
+#include "clipmodel/TextForms.h"
+
+namespace {
+
+using namespace OrloReader;
+
+TEST(TextFormsTest, NumbersAndRationals) {
+    EXPECT_EQ(ToString(0ull), "0");
+    EXPECT_EQ(ToString(172800000ull), "172800000");
+    // Printed as signed.
+    EXPECT_EQ(ToString(ULLONG_MAX), "-1");
+    // The denominator first.
+    EXPECT_EQ(ToString(_aafRational_t{30000, 1001}), "1001/30000");
+}
+
+TEST(TextFormsTest, MobIDLeavesOutLabelBytesSixToEleven) {
+    _aafMobID_t id{};
+    const unsigned char label[12] = {0x06, 0x0A, 0x2B, 0x34, 0x01, 0x01, 0xEE, 0xEE, 0xEE, 0xEE, 0xEE, 0xEE};
+    std::copy(label, label + 12, id.SMPTELabel);
+    id.length = 0x13;
+    id.instanceHigh = 0xB1;
+    id.instanceMid = 0x02;
+    id.instanceLow = 0xA1;
+    id.material = {0x12345678, 0x9ABC, 0xDEF0, {1, 2, 3, 4, 5, 6, 7, 0xFF}};
+    EXPECT_EQ(ToString(id), "060A2B340101" "13B102A1" "12345678" "9ABC" "DEF0" "01020304050607FF");
+}
+
+TEST(TextFormsTest, TimeCodeInfoAlwaysWithColons) {
+    EXPECT_EQ(ToString(TimeCodeInfo(1, 2, 3, 5, 60, true)), "01:02:03:05");
+    EXPECT_EQ(ToString(TimeCodeInfo(0, 0, 0, 0)), "00:00:00:00");
+}
+
+TEST(TextFormsTest, TimeStampRepeatsTheYearInTheDaysPlace) {
+    _aafTimeStamp_t stamp{};
+    stamp.date = {2016, 3, 7};
+    stamp.time = {9, 5, 1, 42};
+    EXPECT_EQ(ToString(stamp), "2016-03-2016T09:05:01+00:00");
+}
+
+using TextParseTest = StartedLibraryTest;
+
+TEST_F(TextParseTest, UIDToTextAndBack) {
+    const _tovUID uid{0x12345678, 0x9ABC, 0xDEF0, {0x01, 0x02, 0x03, 0x04, 0x05, 0x06, 0x07, 0xFF}};
+    const std::string text = ToString(uid);
+    EXPECT_EQ(text, "urn:uuid:12345678-9abc-def0-0102-0304050607ff");
+    EXPECT_EQ(StringToUID(Text(text.c_str())), uid);
+    EXPECT_EQ(StringToUID(Text("urn:uuid:12345678-9ABC-DEF0-0102-0304050607FF")), uid);
+}
+
+TEST_F(TextParseTest, StringToUIDKeepsZeroWhereTheTextStops) {
+    const _tovUID partial = StringToUID(Text("urn:uuid:12345678-9abc"));
+    EXPECT_EQ(partial, (_tovUID{0x12345678, 0x9ABC, 0, {}}));
+    EXPECT_EQ(StringToUID(Text("uuid:12345678")), _tovUID{});
+    EXPECT_EQ(StringToUID(ZEB::ZEBString()), _tovUID{});
+}
+
+TEST_F(TextParseTest, StringToTimecodeFillsFromTheRight) {
+    struct Case {
+        const char* text;
+        int hours, minutes, seconds, frames;
+    };
+    const Case cases[] = {
+        {"01:02:03:04", 1, 2, 3, 4},
+        {"10;00;00;00", 10, 0, 0, 0},
+        {"01:02:03.04", 1, 2, 3, 4},
+        {"02:03:04", 0, 2, 3, 4},
+        {"7", 0, 0, 0, 7},
+        // Digits are paired from the end, whatever the separators say.
+        {"1:2:3:4", 0, 0, 12, 34},
+        {"12345678901", 45, 67, 89, 1},
+        {"TC 23:59:59:29 end", 23, 59, 59, 29},
+        {"", 0, 0, 0, 0},
+        {"no digits", 0, 0, 0, 0},
+    };
+    for (const Case& c : cases) {
+        SCOPED_TRACE(c.text);
+        const TimeCodeInfo info = StringToTimecode(Text(c.text));
+        EXPECT_EQ(info.GetHours(), c.hours);
+        EXPECT_EQ(info.GetMinutes(), c.minutes);
+        EXPECT_EQ(info.GetSeconds(), c.seconds);
+        EXPECT_EQ(info.GetFrames(), c.frames);
+        EXPECT_EQ(info.GetFPS(), 0);
+        EXPECT_FALSE(info.IsDropFrame());
+        EXPECT_EQ(info.GetTotalFrames(), -1);
+    }
+}
+
+TEST(TextFormsTest, TimeCodeToTimeCodeInfoKeepsTheCount) {
+    const Timecode::timecodeDesc_t drop = Timecode::TCCreateDesc(1, 30);
+    TimeCodeInfo info;
+    TimeCodeToTimeCodeInfo(Timecode::TCCreateDur(1800, &drop), info);
+    std::string text;
+    info.ToString(text);
+    EXPECT_EQ(text, "00;01;00;02");
+    EXPECT_EQ(info.GetFPS(), 30);
+    EXPECT_EQ(info.GetTotalFrames(), 1800);
+
+    // Days are dropped; the count keeps them.
+    const Timecode::timecodeDesc_t plain = Timecode::TCCreateDesc(0, 25);
+    TimeCodeToTimeCodeInfo(Timecode::TCCreateDur(25 * 86400 + 26, &plain), info);
+    info.ToString(text);
+    EXPECT_EQ(text, "00:00:01:01");
+    EXPECT_FALSE(info.IsDropFrame());
+    EXPECT_EQ(info.GetTotalFrames(), 25 * 86400 + 26);
+}
+
+TEST(TextFormsTest, TimeToSamplesTruncates) {
+    unsigned long long samples = 0;
+    TimeToSamples(1, 2, 3, 48000, samples);
+    EXPECT_EQ(samples, 3723ull * 48000);
+    TimeToSamples(10, 0, 0, 44100, samples);
+    EXPECT_EQ(samples, 36000ull * 44100);
+    TimeToSamples(0, 0, 1, 0.75, samples);
+    EXPECT_EQ(samples, 0ull);
+    TimeToSamples(0, 0, 3, 0.75, samples);
+    EXPECT_EQ(samples, 2ull);
+}
+
+}  // namespace
