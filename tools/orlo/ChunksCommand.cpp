@@ -1,11 +1,11 @@
 #include "ChunksCommand.h"
 
-#include <algorithm>
 #include <cstdio>
 #include <nlohmann/json.hpp>
 #include <stdexcept>
 
 #include "IxmlReport.h"
+#include "JsonText.h"
 #include "OrloSession.h"
 #include "reader/BEXTChunk.h"
 #include "reader/ChunkIds.h"
@@ -103,13 +103,7 @@ Json Report(const std::string& path, const OrloStream& stream, ITOVComponentFact
     return out;
 }
 
-// Recorders put any bytes into text fields: never fail on them.
-std::string Dump(const Json& value, int indent = -1) {
-    return value.dump(indent, ' ', false, Json::error_handler_t::replace);
-}
-
-// "key: value" lines, nested objects indented; texts with line breaks or other
-// control characters, and lists, are shown as JSON.
+// "key: value" lines, nested objects indented.
 void PrintText(const Json& object, int depth) {
     for (const auto& [key, value] : object.items()) {
         const std::string margin(depth * 2, ' ');
@@ -118,17 +112,7 @@ void PrintText(const Json& object, int depth) {
             PrintText(value, depth + 1);
             continue;
         }
-        std::string shown;
-        if (value.is_null()) {
-            shown = "-";
-        } else if (value.is_string()) {
-            const std::string& text = value.get_ref<const std::string&>();
-            const bool plain = std::none_of(text.begin(), text.end(), [](char c) { return c >= 0 && c < 0x20; });
-            shown = plain ? text : Dump(value);
-        } else {
-            shown = Dump(value);
-        }
-        std::printf("%s%s: %s\n", margin.c_str(), key.c_str(), shown.c_str());
+        std::printf("%s%s: %s\n", margin.c_str(), key.c_str(), ShownValue(value).c_str());
     }
 }
 
@@ -147,7 +131,7 @@ int ChunksCommand::Run(const OrloOptions& options) {
     const OrloStream stream(m_Path.c_str(), 255);
     const Json report = Report(m_Path, stream, &session.Host());
     if (m_Json) {
-        std::printf("%s\n", Dump(report, 2).c_str());
+        std::printf("%s\n", JsonDump(report, 2).c_str());
     } else {
         PrintText(report, 0);
     }

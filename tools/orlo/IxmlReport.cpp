@@ -1,7 +1,7 @@
 #include "IxmlReport.h"
 
-#include <cstdio>
-
+#include "JsonMaybe.h"
+#include "ResultText.h"
 #include "reader/IXMLTextParsers.h"
 #include "reader/ParceRawIXML.h"
 
@@ -10,21 +10,16 @@ namespace {
 using Json = nlohmann::ordered_json;
 using namespace Chunks::IXML;
 
-// A value whose has flag is false is null.
-template <typename T>
-Json Maybe(bool has, const T& value) {
-    return has ? Json(value) : Json(nullptr);
-}
-
-Json Maybe(bool has, const ZEB::ZEBString& value) { return has ? Json(UTF8Text(value)) : Json(nullptr); }
+// iXML texts as UTF-8.
+Json TextMaybe(bool has, const ZEB::ZEBString& value) { return JsonMaybe(has, UTF8Text(value)); }
 
 Json Tracks(const IXMLData& data) {
     if (!data.HasTracksList()) return nullptr;
     Json tracks = Json::array();
     for (const IXMLTrack& track : data.GetTracksList())
-        tracks.push_back({{"name", Maybe(track.HasName(), track.GetName())},
-                          {"channelIndex", Maybe(track.HasChannelIndex(), track.GetChannelIndex())},
-                          {"interleaveIndex", Maybe(track.HasInterleaveIndex(), track.GetInterleaveIndex())}});
+        tracks.push_back({{"name", TextMaybe(track.HasName(), track.GetName())},
+                          {"channelIndex", JsonMaybe(track.HasChannelIndex(), track.GetChannelIndex())},
+                          {"interleaveIndex", JsonMaybe(track.HasInterleaveIndex(), track.GetInterleaveIndex())}});
     return tracks;
 }
 
@@ -32,12 +27,12 @@ Json Speed(const IXMLData& data) {
     if (!data.HasSpeed()) return nullptr;
     const IXMLSpeed speed = data.GetSpeed();
     const _aafRational_t rate = speed.GetTimeCodeRate();
-    return {{"timecodeRate", Maybe(speed.HasTimeCodeRate(),
+    return {{"timecodeRate", JsonMaybe(speed.HasTimeCodeRate(),
                                    std::to_string(rate.numerator) + "/" + std::to_string(rate.denominator))},
-            {"timecodeDrop", Maybe(speed.HasTimeCodeFlag(), speed.GetTimeCodeFlag())},
-            {"timestampSampleRate", Maybe(speed.HasTimeStampSampleRate(), speed.GetTimeStampSampleRate())},
-            {"samplesSinceMidnight", Maybe(speed.HasSamplesSinceMidnight(), speed.GetSamplesSinceMidnight())},
-            {"digitizerSampleRate", Maybe(speed.HasDigitizerSampleRate(), speed.GetDigitizerSampleRate())}};
+            {"timecodeDrop", JsonMaybe(speed.HasTimeCodeFlag(), speed.GetTimeCodeFlag())},
+            {"timestampSampleRate", JsonMaybe(speed.HasTimeStampSampleRate(), speed.GetTimeStampSampleRate())},
+            {"samplesSinceMidnight", JsonMaybe(speed.HasSamplesSinceMidnight(), speed.GetSamplesSinceMidnight())},
+            {"digitizerSampleRate", JsonMaybe(speed.HasDigitizerSampleRate(), speed.GetDigitizerSampleRate())}};
 }
 
 }  // namespace
@@ -45,25 +40,23 @@ Json Speed(const IXMLData& data) {
 Json IxmlReport(const std::string& rawXml, ITOVComponentFactory* factory) {
     IXMLData data;
     const TOVRESULT result = ParceRawIXML(rawXml, factory, data);
-    char code[16];
-    std::snprintf(code, sizeof code, "0x%08X", static_cast<unsigned>(result));
     return {{"raw", rawXml},
             {"parsed", data.parsed},
-            {"result", result == TOV_OK ? Json(0) : Json(code)},
-            {"version", Maybe(data.HasVersion(), data.GetVersion())},
-            {"project", Maybe(data.HasProject(), data.GetProject())},
-            {"scene", Maybe(data.HasScene(), data.GetScene())},
-            {"take", Maybe(data.HasTake(), data.GetTake())},
-            {"tape", Maybe(data.HasTape(), data.GetTape())},
-            {"ubits", Maybe(data.HasUBITS(), data.GetUBITS())},
-            {"notes", Maybe(data.HasNotes(), data.GetNotes())},
-            {"user", Maybe(data.HasUser(), data.GetUser())},
-            {"fileUID", Maybe(data.HasFileUID(), data.GetFileUID())},
-            {"circled", Maybe(data.HasCircled(), data.GetCircled())},
-            {"noGood", Maybe(data.HasNoGood(), data.GetNoGood())},
-            {"falseStart", Maybe(data.HasFalseStart(), data.GetFalseStart())},
-            {"wildTrack", Maybe(data.HasWildTrack(), data.GetWildTrack())},
-            {"tracksCount", Maybe(data.HasTracksCount(), data.GetTracksCount())},
+            {"result", ResultJson(result)},
+            {"version", JsonMaybe(data.HasVersion(), data.GetVersion())},
+            {"project", TextMaybe(data.HasProject(), data.GetProject())},
+            {"scene", TextMaybe(data.HasScene(), data.GetScene())},
+            {"take", TextMaybe(data.HasTake(), data.GetTake())},
+            {"tape", TextMaybe(data.HasTape(), data.GetTape())},
+            {"ubits", TextMaybe(data.HasUBITS(), data.GetUBITS())},
+            {"notes", TextMaybe(data.HasNotes(), data.GetNotes())},
+            {"user", TextMaybe(data.HasUser(), data.GetUser())},
+            {"fileUID", TextMaybe(data.HasFileUID(), data.GetFileUID())},
+            {"circled", JsonMaybe(data.HasCircled(), data.GetCircled())},
+            {"noGood", JsonMaybe(data.HasNoGood(), data.GetNoGood())},
+            {"falseStart", JsonMaybe(data.HasFalseStart(), data.GetFalseStart())},
+            {"wildTrack", JsonMaybe(data.HasWildTrack(), data.GetWildTrack())},
+            {"tracksCount", JsonMaybe(data.HasTracksCount(), data.GetTracksCount())},
             {"tracks", Tracks(data)},
             {"speed", Speed(data)}};
 }

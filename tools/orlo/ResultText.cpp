@@ -1,0 +1,13 @@
+#include "ResultText.h"
+
+#include <cstdio>
+
+std::string ResultText(TOVRESULT result) {
+    char code[16];
+    std::snprintf(code, sizeof code, "0x%08X", static_cast<unsigned>(result));
+    return code;
+}
+
+nlohmann::ordered_json ResultJson(TOVRESULT result) {
+    return result == TOV_OK ? nlohmann::ordered_json(0) : nlohmann::ordered_json(ResultText(result));
+}
