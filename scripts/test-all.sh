@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs what is missing, builds, and runs every test: once in a plain
 # build, once more under AddressSanitizer and UndefinedBehaviorSanitizer; then
-# runs the fuzzers for a minute and a half.
+# runs the fuzzers for two minutes and a half.
 set -euo pipefail
 root=$(cd "$(dirname "$0")/.." && pwd)
 bash "$root/scripts/install-deps.sh"
@@ -15,6 +15,9 @@ ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:ha
     ctest --test-dir "$root/build-asan" --output-on-failure -j "$(nproc)"
 
 # The fuzzers, built with clang, under AddressSanitizer: the chunk walk for a
-# minute, the iXML text for half a minute.
+# minute, the whole intake of a file and the iXML text for half a minute each,
+# the clip model's text parsers for twenty seconds.
 bash "$root/scripts/fuzz.sh" 60 fuzz_chunk_stream
+bash "$root/scripts/fuzz.sh" 30 fuzz_movie
 bash "$root/scripts/fuzz.sh" 30 fuzz_ixml
+bash "$root/scripts/fuzz.sh" 20 fuzz_clip_text

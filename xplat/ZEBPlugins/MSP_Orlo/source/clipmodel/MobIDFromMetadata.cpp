@@ -104,14 +104,16 @@ bool GenerateUIDFromFile(ZEB::ZEBString path, _aafUID_t& uid) {
     std::vector<unsigned char> buffer;
     if (!GetBufferForHash(reinterpret_cast<const char*>(path.GetUTF8String()), buffer)) return false;
     void* digest = nullptr;
-    if (ZEB::GenerateUMIDFromData_Begin(&digest) != 0) return false;
-    if (ZEB::GenerateUMIDFromData_AddData(&digest, static_cast<unsigned int>(buffer.size()), buffer.data()) != 0 ||
-        ZEB::GenerateUMIDFromData_Finish(&digest, &uid) != 0) {
-        // Finish frees the digest; a failed AddData leaves it to be finished.
-        if (digest != nullptr) ZEB::GenerateUMIDFromData_Finish(&digest, &uid);
-        return false;
+    const bool made =
+        ZEB::GenerateUMIDFromData_Begin(&digest) == 0 &&
+        ZEB::GenerateUMIDFromData_AddData(&digest, static_cast<unsigned int>(buffer.size()), buffer.data()) == 0 &&
+        ZEB::GenerateUMIDFromData_Finish(&digest, &uid) == 0;
+    // A digest left open by a failed step is finished only to free it.
+    if (digest != nullptr) {
+        _aafUID_t unused{};
+        ZEB::GenerateUMIDFromData_Finish(&digest, &unused);
     }
-    return true;
+    return made;
 }
 
 bool GetBufferForHash(const std::string& path, std::vector<unsigned char>& buffer) {

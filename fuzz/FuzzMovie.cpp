@@ -1,0 +1,65 @@
+// libFuzzer target: the whole intake of one file into a Movie (chunk walk,
+// iXML, the rules of trust, start timecode, identity, tracks) over any bytes.
+// The first byte of the input also switches the five toggles, so that every
+// route of the rules is reached.
+#include <fcntl.h>
+#include <sys/mman.h>
+#include <unistd.h>
+
+#include <cstdint>
+#include <cstdlib>
+#include <string>
+
+#include "FuzzHost.h"
+#include "boundary/DynamicToggles.h"
+#include "boundary/ModuleGlobals.h"
+#include "boundary/OrloConstants.h"
+#include "clipmodel/Movie.h"
+
+namespace {
+
+int g_memoryFile = -1;
+std::string g_path;
+TOVPtr<ITOVComponentFactory> g_factory;
+
+const char* const kToggles[] = {toggle_MobIDFromiXML, toggle_StartTimeCodeFromFileCreationTime,
+                                toggle_StartTimeCodeFromBEXTOriginationDate, toggle_BigEndianSmpteIdInBEXTData,
+                                toggle_IgnoreHostSettingsForUnitTest};
+
+}  // namespace
+
+extern "C" int LLVMFuzzerInitialize(int*, char***) {
+    ITOVComponentFactory* factory = StartFuzzHost();
+    g_factory.Assign(factory);
+    // The plug-in's globals, as its start-up sets them.
+    OrloReader::InitOrloReader(factory);
+    if (factory->QueryInterface(IID_ITOVConsole, reinterpret_cast<void**>(&g_pConsole)) < 0) std::abort();
+    ZEB::Impl::RegisterDynamicToggles(g_factory);
+    g_memoryFile = memfd_create("orlo-fuzz-movie", 0);
+    if (g_memoryFile < 0) std::abort();
+    g_path = "/proc/self/fd/" + std::to_string(g_memoryFile);
+    return 0;
+}
+
+extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
+    if (ftruncate(g_memoryFile, 0) != 0) std::abort();
+    if (size > 0 && pwrite(g_memoryFile, data, size, 0) != static_cast<ssize_t>(size)) std::abort();
+    const unsigned bits = size > 0 ? data[0] : 0;
+    for (unsigned i = 0; i < 5; ++i)
+        if (ZEB::Impl::SetDynamicToggleValue(g_factory, kToggles[i], (bits >> i) & 1) != 0) std::abort();
+
+    OrloReader::Movie movie;
+    const TOVRESULT result = movie.InitFromFile(ZEB::ZEBString(reinterpret_cast<const unsigned char*>(g_path.c_str())),
+                                                g_factory.Get(), true);
+    if (result == 0) {
+        // A finished movie always starts with its timecode track.
+        if (movie.GetTrackCount() == 0 || movie.GetTrack(0)->GetMedia()->GetType() != OrloReader::kMediaTypeTimecode)
+            std::abort();
+        for (unsigned i = 1; i < movie.GetTrackCount(); ++i) {
+            const auto media = movie.GetTrack(i)->GetMedia();
+            if (media->GetSoundDescriptor() == nullptr) std::abort();
+            media->GetSampleOffset(media->GetSampleCount());
+        }
+    }
+    return 0;
+}
