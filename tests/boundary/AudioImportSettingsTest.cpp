@@ -104,8 +104,7 @@ TEST(CallersSettings, AreAskedOnlyWhileTheHostIsIgnored) {
         TOVPtr<IHostSettings> settings;
         settings.Assign(&own);
         bool autodetect = true;
-        EXPECT_EQ(GetAudioImportSettings(c.withFactory ? fresh.factory.Get() : nullptr, settings, autodetect),
-                  TOV_OK);
+        EXPECT_EQ(GetAudioImportSettings(c.withFactory ? fresh.factory.Get() : nullptr, settings, autodetect), TOV_OK);
         EXPECT_EQ(autodetect, c.after);
         EXPECT_EQ(settings.Get() == &own, c.kept == Kept::CallersOwn);
         EXPECT_EQ(settings.Get() != nullptr, c.kept != Kept::Nothing);

@@ -21,8 +21,7 @@ public:
     MOCK_METHOD(TOVRESULT, CreateComponent, (const _tovUID& compID, ITOVUnknown* outer, const _tovUID& iid, void** out),
                 (override));
     MOCK_METHOD(TOVRESULT, GetClassFactory, (const _tovUID& clsid, const _tovUID& iid, void** out), (override));
-    MOCK_METHOD(TOVRESULT, GetComponentDefinition, (const _tovUID& compID, const _tovUID& iid, void** out),
-                (override));
+    MOCK_METHOD(TOVRESULT, GetComponentDefinition, (const _tovUID& compID, const _tovUID& iid, void** out), (override));
 };
 
 class MockManager : public IFTFManager {

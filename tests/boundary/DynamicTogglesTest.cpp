@@ -123,25 +123,33 @@ struct AccessCase {
 };
 
 const AccessCase kAccessCases[] = {
-    {"factory fails", [](MockFactory& f, MockManager&) {
+    {"factory fails",
+     [](MockFactory& f, MockManager&) {
          ON_CALL(f, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(CLASS_E_CLASSNOTAVAILABLE));
-     }, CLASS_E_CLASSNOTAVAILABLE, CLASS_E_CLASSNOTAVAILABLE},
-    {"factory gives no manager", [](MockFactory& f, MockManager&) {
-         ON_CALL(f, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(TOV_OK));
-     }, TOV_E_UNEXPECTED, TOV_E_UNEXPECTED},
+     },
+     CLASS_E_CLASSNOTAVAILABLE, CLASS_E_CLASSNOTAVAILABLE},
+    {"factory gives no manager",
+     [](MockFactory& f, MockManager&) { ON_CALL(f, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(TOV_OK)); },
+     TOV_E_UNEXPECTED, TOV_E_UNEXPECTED},
     {"not registered", [](MockFactory&, MockManager& m) { ON_CALL(m, IsToggleRegistered(_)).WillByDefault(Return(0)); },
      ZEB_E_NOTFOUND, ZEB_E_NOTFOUND},
-    {"registration check throws", [](MockFactory&, MockManager& m) {
+    {"registration check throws",
+     [](MockFactory&, MockManager& m) {
          ON_CALL(m, IsToggleRegistered(_)).WillByDefault(::testing::Throw(std::runtime_error("lost")));
-     }, ZEB_E_NOTFOUND, TOV_E_UNEXPECTED},
-    {"access throws a result", [](MockFactory&, MockManager& m) {
+     },
+     ZEB_E_NOTFOUND, TOV_E_UNEXPECTED},
+    {"access throws a result",
+     [](MockFactory&, MockManager& m) {
          ON_CALL(m, GetToggleValue(_, _)).WillByDefault(::testing::Throw(static_cast<int>(TOV_E_FAIL)));
          ON_CALL(m, SetToggleValue(_, _)).WillByDefault(::testing::Throw(static_cast<int>(TOV_E_FAIL)));
-     }, ZEB_E_NOTFOUND, TOV_E_UNEXPECTED},
-    {"access fails", [](MockFactory&, MockManager& m) {
+     },
+     ZEB_E_NOTFOUND, TOV_E_UNEXPECTED},
+    {"access fails",
+     [](MockFactory&, MockManager& m) {
          ON_CALL(m, GetToggleValue(_, _)).WillByDefault(Return(TOV_E_OUTOFRANGE));
          ON_CALL(m, SetToggleValue(_, _)).WillByDefault(Return(TOV_E_OUTOFRANGE));
-     }, TOV_E_OUTOFRANGE, TOV_E_OUTOFRANGE},
+     },
+     TOV_E_OUTOFRANGE, TOV_E_OUTOFRANGE},
 };
 
 TEST(ToggleAccess, ReadAndSetReportEachFailureAsTheirOwn) {

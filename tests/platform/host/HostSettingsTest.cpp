@@ -51,8 +51,8 @@ struct SizeCase {
 };
 
 TEST_F(HostSettingsTest, AnySizeUpTo32BitsReadsAndWritesTheWholeValue) {
-    const SizeCase cases[] = {{0, TOV_E_INVALIDARG}, {1, TOV_OK},   {8, TOV_OK},
-                              {16, TOV_OK},         {32, TOV_OK},  {33, TOV_E_INVALIDARG}};
+    const SizeCase cases[] = {{0, TOV_E_INVALIDARG}, {1, TOV_OK},  {8, TOV_OK},
+                              {16, TOV_OK},          {32, TOV_OK}, {33, TOV_E_INVALIDARG}};
     for (const SizeCase& c : cases) {
         SCOPED_TRACE(c.size);
         EXPECT_EQ(settings->SetSetting(kGrouping, c.size, 0x12345678u + c.size), c.expected);

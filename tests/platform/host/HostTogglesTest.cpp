@@ -109,19 +109,22 @@ struct SlotCase {
 
 // Every slot that takes a path, called with a path that is not registered and with none.
 const SlotCase kPathSlots[] = {
-    {"GetToggleGroup", [](IFTFManager& m, const char* p) {
+    {"GetToggleGroup",
+     [](IFTFManager& m, const char* p) {
          ITOVString* group = nullptr;
          const TOVRESULT result = m.GetToggleGroup(p, &group);
          EXPECT_EQ(group, nullptr);
          return result;
      }},
-    {"GetToggleDefault", [](IFTFManager& m, const char* p) {
+    {"GetToggleDefault",
+     [](IFTFManager& m, const char* p) {
          uint32_t value = 0xDEAD;
          const TOVRESULT result = m.GetToggleDefault(p, &value);
          EXPECT_EQ(value, 0xDEADu);
          return result;
      }},
-    {"GetToggleValue", [](IFTFManager& m, const char* p) {
+    {"GetToggleValue",
+     [](IFTFManager& m, const char* p) {
          uint32_t value = 0xDEAD;
          const TOVRESULT result = m.GetToggleValue(p, &value);
          EXPECT_EQ(value, 0xDEADu);

@@ -12,8 +12,7 @@ namespace {
 
 TOVPtr<ITOVUIDGeneratorMD5> NewGenerator(TOVHost* host) {
     TOVPtr<ITOVUIDGeneratorMD5> generator;
-    EXPECT_EQ(host->CreateComponent(TOVCompID_UIDGenerator, nullptr, IID_ITOVUIDGeneratorMD5, generator.Out()),
-              TOV_OK);
+    EXPECT_EQ(host->CreateComponent(TOVCompID_UIDGenerator, nullptr, IID_ITOVUIDGeneratorMD5, generator.Out()), TOV_OK);
     return generator;
 }
 
@@ -92,13 +91,14 @@ TEST_F(UIDGenerator, FieldsReadInTheMachinesByteOrder) {
 }
 
 TEST_F(UIDGenerator, PiecesDigestAsTheWhole) {
-    const std::string whole = Digest({"12345678901234567890123456789012345678901234567890123456789012345678901234567890"});
+    const std::string whole =
+        Digest({"12345678901234567890123456789012345678901234567890123456789012345678901234567890"});
     EXPECT_EQ(Digest({"1234567890123456789012345678901234567890123456789012345678901234",  // one MD5 block
                       "5678901234567890"}),
               whole);
-    EXPECT_EQ(Digest({"1", "", "234567890123456789012345678901234567890123456789012345678901234567890123456789",
-                      "0", ""}),
-              whole);
+    EXPECT_EQ(
+        Digest({"1", "", "234567890123456789012345678901234567890123456789012345678901234567890123456789", "0", ""}),
+        whole);
     EXPECT_EQ(Digest({"", ""}), kVectors[0].md5);
 }
 

@@ -20,7 +20,8 @@
 #include "tov/ITOVUIDGeneratorMD5.h"
 #include "tov/sdk/CTOVUnknown.h"
 
-inline constexpr _tovUID CLSID_HostUIDGeneratorMD5 = {0x9FADABD7, 0xD5F4, 0x44EE, {0x97, 0x73, 0xEE, 0x5B, 0x23, 0x4A, 0xE6, 0x83}};
+inline constexpr _tovUID CLSID_HostUIDGeneratorMD5 = {
+    0x9FADABD7, 0xD5F4, 0x44EE, {0x97, 0x73, 0xEE, 0x5B, 0x23, 0x4A, 0xE6, 0x83}};
 
 class HostUIDGeneratorMD5 : public ITOVUIDGeneratorMD5, public CTOVUnknown {
 public:
