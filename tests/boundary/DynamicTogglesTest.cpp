@@ -169,16 +169,6 @@ TEST(ToggleAccess, ReadAndSetReportEachFailureAsTheirOwn) {
     }
 }
 
-TEST_F(TogglesOnStandIns, ReadAndSetPassThePathAndValueThrough) {
-    EXPECT_CALL(manager, GetToggleValue(::testing::StrEq(toggle_BigEndianSmpteIdInBEXTData), _))
-        .WillOnce(::testing::DoAll(::testing::SetArgPointee<1>(3u), Return(TOV_OK)));
-    unsigned int value = 0;
-    EXPECT_EQ(RetrieveDynamicToggleValue(&factory, toggle_BigEndianSmpteIdInBEXTData, &value), TOV_OK);
-    EXPECT_EQ(value, 3u);
-    EXPECT_CALL(manager, SetToggleValue(::testing::StrEq(toggle_MobIDFromiXML), 9u)).WillOnce(Return(TOV_OK));
-    EXPECT_EQ(SetDynamicToggleValue(held, toggle_MobIDFromiXML, 9), TOV_OK);
-}
-
 TEST_F(TogglesOnStandIns, RegistrationThrowsTheFactorysFailure) {
     ON_CALL(factory, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(ZEB_E_NOTFOUND));
     try {

@@ -33,8 +33,8 @@ unsigned char* Bytes(std::string& text) { return reinterpret_cast<unsigned char*
 
 class UIDGenerator : public ::testing::Test {
 protected:
-    // The digest of `pieces` fed one after the other into one context.
-    std::string Digest(std::initializer_list<std::string> pieces) {
+    // The UID of `pieces` fed one after the other into one context.
+    _aafUID_t UIDOf(std::initializer_list<std::string> pieces) {
         void* context = nullptr;
         EXPECT_EQ(generator->Begin(&context), TOV_OK);
         for (std::string piece : pieces)
@@ -42,8 +42,9 @@ protected:
         _aafUID_t uid{};
         EXPECT_EQ(generator->Finish(&uid, &context), TOV_OK);
         EXPECT_EQ(context, nullptr);
-        return Hex(uid);
+        return uid;
     }
+    std::string Digest(std::initializer_list<std::string> pieces) { return Hex(UIDOf(pieces)); }
 
     TestHost host;
     TOVPtr<ITOVUIDGeneratorMD5> generator = NewGenerator(host.Get());
@@ -74,12 +75,7 @@ TEST_F(UIDGenerator, CopiesTheDigestBytesInOrder) {
 
 TEST_F(UIDGenerator, FieldsReadInTheMachinesByteOrder) {
 #if defined(__BYTE_ORDER__) && __BYTE_ORDER__ == __ORDER_LITTLE_ENDIAN__
-    void* context = nullptr;
-    ASSERT_EQ(generator->Begin(&context), TOV_OK);
-    std::string abc = "abc";
-    ASSERT_EQ(generator->AddData(context, Bytes(abc), 3), TOV_OK);
-    _aafUID_t uid{};
-    ASSERT_EQ(generator->Finish(&uid, &context), TOV_OK);
+    const _aafUID_t uid = UIDOf({"abc"});
     EXPECT_EQ(uid.Data1, 0x98500190u);
     EXPECT_EQ(uid.Data2, 0xd23cu);
     EXPECT_EQ(uid.Data3, 0xb04fu);
