@@ -6,6 +6,7 @@
 #include "ChunksCommand.h"
 #include "OrloOptions.h"
 #include "OrloVersion.h"
+#include "ProbeCommand.h"
 #include "VersionCommand.h"
 #include "tov/ITOVConsole.h"
 #include "tov/host/HostConsole.h"
@@ -27,6 +28,7 @@ int main(int argc, char** argv) {
     std::vector<std::unique_ptr<OrloCommand>> commands;
     commands.push_back(std::make_unique<VersionCommand>());
     commands.push_back(std::make_unique<ChunksCommand>());
+    commands.push_back(std::make_unique<ProbeCommand>());
     std::vector<CLI::App*> declared;
     for (auto& command : commands) declared.push_back(command->Declare(app));
 
