@@ -10,10 +10,10 @@
 namespace HelperFunctions {
 
 const FrameRateConvertRow s_tableFrameRateConvert[kFrameRateConvertRows] = {
-    {23.9, 24.0, {24000, 1001}},      {24.0, 25.0, {24, 1}},         {25.0, 26.0, {25, 1}},
-    {29.9, 30.0, {30000, 1001}},      {30.0, 31.0, {30, 1}},         {50.0, 51.0, {50, 1}},
-    {59.9, 60.0, {60000, 1001}},      {60.0, 61.0, {60, 1}},         {40000.0, 47000.0, {44100, 1}},
-    {47000.0, 95000.0, {48000, 1}},   {95000.0, 100000.0, {96000, 1}},
+    {23.9, 24.0, {24000, 1001}},    {24.0, 25.0, {24, 1}},           {25.0, 26.0, {25, 1}},
+    {29.9, 30.0, {30000, 1001}},    {30.0, 31.0, {30, 1}},           {50.0, 51.0, {50, 1}},
+    {59.9, 60.0, {60000, 1001}},    {60.0, 61.0, {60, 1}},           {40000.0, 47000.0, {44100, 1}},
+    {47000.0, 95000.0, {48000, 1}}, {95000.0, 100000.0, {96000, 1}},
 };
 
 namespace {
@@ -89,9 +89,8 @@ bool StringToFrameRate(const ZEB::ZEBString& text, unsigned short* fps, bool* in
         bool interlaced;
     };
     static const VideoFormat formats[] = {
-        {"23.976p", 24, false}, {"24p", 24, false},    {"29.97i", 30, true}, {"30i", 30, true},
-        {"25p", 25, false},     {"25i", 25, true},     {"59.94p", 30, false}, {"59.94i", 30, true},
-        {"50p", 25, false},     {"50i", 25, true},
+        {"23.976p", 24, false}, {"24p", 24, false},    {"29.97i", 30, true}, {"30i", 30, true},  {"25p", 25, false},
+        {"25i", 25, true},      {"59.94p", 30, false}, {"59.94i", 30, true}, {"50p", 25, false}, {"50i", 25, true},
     };
     if (text.IsEmpty()) return false;
     const char* name = reinterpret_cast<const char*>(text.GetUTF8String());

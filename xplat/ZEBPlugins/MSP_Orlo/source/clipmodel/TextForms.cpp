@@ -31,18 +31,17 @@ std::string ToString(const _aafMobID_t& id) {
     int at = 0;
     for (int i = 0; i < 6; ++i) at += std::snprintf(text + at, sizeof text - at, "%02X", id.SMPTELabel[i]);
     const aafUID_t& m = id.material;
-    std::snprintf(text + at, sizeof text - at,
-                  "%02X%02X%02X%02X%08X%04X%04X%02X%02X%02X%02X%02X%02X%02X%02X", id.length, id.instanceHigh,
-                  id.instanceMid, id.instanceLow, m.Data1, m.Data2, m.Data3, m.Data4[0], m.Data4[1], m.Data4[2],
-                  m.Data4[3], m.Data4[4], m.Data4[5], m.Data4[6], m.Data4[7]);
+    std::snprintf(text + at, sizeof text - at, "%02X%02X%02X%02X%08X%04X%04X%02X%02X%02X%02X%02X%02X%02X%02X",
+                  id.length, id.instanceHigh, id.instanceMid, id.instanceLow, m.Data1, m.Data2, m.Data3, m.Data4[0],
+                  m.Data4[1], m.Data4[2], m.Data4[3], m.Data4[4], m.Data4[5], m.Data4[6], m.Data4[7]);
     return text;
 }
 
 std::string ToString(const _tovUID& uid) {
     char text[kTextSize];
-    std::snprintf(text, sizeof text, "urn:uuid:%08x-%04x-%04x-%02x%02x-%02x%02x%02x%02x%02x%02x", uid.Data1,
-                  uid.Data2, uid.Data3, uid.Data4[0], uid.Data4[1], uid.Data4[2], uid.Data4[3], uid.Data4[4],
-                  uid.Data4[5], uid.Data4[6], uid.Data4[7]);
+    std::snprintf(text, sizeof text, "urn:uuid:%08x-%04x-%04x-%02x%02x-%02x%02x%02x%02x%02x%02x", uid.Data1, uid.Data2,
+                  uid.Data3, uid.Data4[0], uid.Data4[1], uid.Data4[2], uid.Data4[3], uid.Data4[4], uid.Data4[5],
+                  uid.Data4[6], uid.Data4[7]);
     return text;
 }
 

@@ -70,8 +70,8 @@ timecode_t TCCreateDur(int frames, const timecodeDesc_t* desc) {
     return timecode_t{desc ? Effective(*desc) : TCdefaultDesc, frames};
 }
 
-timecode_t SamplesToTC(long long samples, double sampleRate, double fps, int fpsIn, unsigned char dropIn,
-                       int fpsOut, unsigned char dropOut) {
+timecode_t SamplesToTC(long long samples, double sampleRate, double fps, int fpsIn, unsigned char dropIn, int fpsOut,
+                       unsigned char dropOut) {
     // One sample more than the position: a frame boundary at sample 0 already
     // counts as passed.
     const int32_t frames = HelperFunctions::TruncateToInt32((static_cast<double>(samples) + 1.0) * fps / sampleRate);
@@ -152,8 +152,8 @@ timecode_t TCConstruct(short days, short hours, short minutes, short seconds, sh
     const FrameUnits units = UnitsOf(tc.desc);
     const int64_t tens = minutes / 10;
     const int64_t minuteUnits = minutes - tens * 10;
-    const int64_t count = days * units.day + hours * units.hour + tens * units.tenMinutes +
-                          minuteUnits * units.minute + seconds * units.fps + frames;
+    const int64_t count = days * units.day + hours * units.hour + tens * units.tenMinutes + minuteUnits * units.minute +
+                          seconds * units.fps + frames;
     // A count beyond 32 bits keeps its low 32 bits.
     tc.count = static_cast<int32_t>(count);
     return tc;

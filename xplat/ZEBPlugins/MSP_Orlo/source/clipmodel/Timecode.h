@@ -52,8 +52,8 @@ timecode_t TCCreateDur(int frames, const timecodeDesc_t* desc);
 /// The timecode of a sample position: the frame reached after samples + 1
 /// samples at `fps`, read at `fpsIn` and `dropIn`, then converted to `fpsOut`
 /// and `dropOut`.
-timecode_t SamplesToTC(long long samples, double sampleRate, double fps, int fpsIn, unsigned char dropIn,
-                       int fpsOut, unsigned char dropOut);
+timecode_t SamplesToTC(long long samples, double sampleRate, double fps, int fpsIn, unsigned char dropIn, int fpsOut,
+                       unsigned char dropOut);
 /// Changes the rate, keeping the displayed fields with the frames scaled.
 void TCConvertFPS(timecode_t* tc, unsigned short fps);
 /// Sets or clears drop frame, keeping the displayed fields; the count changes.
@@ -65,7 +65,6 @@ long long TCToSamples(timecode_t tc, double sampleRate, double fps);
 void TCDeconstruct(timecode_t tc, short* days, short* hours, short* minutes, short* seconds, short* frames);
 /// The timecode of displayed fields under `desc` (null or fps 0: the default),
 /// with the drop bit cleared unless the rate can be drop frame.
-timecode_t TCConstruct(short days, short hours, short minutes, short seconds, short frames,
-                       const timecodeDesc_t* desc);
+timecode_t TCConstruct(short days, short hours, short minutes, short seconds, short frames, const timecodeDesc_t* desc);
 
 }  // namespace Timecode
