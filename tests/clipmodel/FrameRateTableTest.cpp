@@ -22,48 +22,27 @@ struct RateCase {
 
 TEST(FrameRateTableTest, RationalRateFromFPS) {
     const RateCase cases[] = {
-        // Frame rates, from the truncated low bound up to under the high one.
+        // Table rows, searched from the truncated low bound.
         {23.0, 24000, 1001},
-        {23.976, 24000, 1001},
         {24.0, 24, 1},
-        {25.5, 25, 1},
         {29.0, 30000, 1001},
-        {29.97, 30000, 1001},
-        {30.0, 30, 1},
-        {50.0, 50, 1},
         {59.94, 60000, 1001},
-        {60.0, 60, 1},
-        // Figures between frame rates are rounded.
-        {26.4, 26, 1},
-        {26.5, 27, 1},
-        {48.0, 48, 1},
-        // Sample rates.
         {44100.0, 44100, 1},
-        {46999.0, 44100, 1},
-        {48000.0, 48000, 1},
-        {96000.0, 96000, 1},
+        // Between rows, and from 100000 up: rounded.
+        {26.5, 27, 1},
         {100000.0, 100000, 1},
-        // Three and four times a frame rate, between 69 and under 244.
+        // Three times a frame rate from 69 to under 183, then four times.
         {68.9, 69, 1},
-        {69.0, 69, 1},
         {71.5, 72000, 1001},
         {72.0, 72, 1},
-        {75.0, 75, 1},
         {89.9, 90000, 1001},
-        {150.0, 150, 1},
-        {179.8, 180000, 1001},
-        {180.0, 180, 1},
         {182.9, 180, 1},
         {183.0, 183, 1},
-        {95.9, 96000, 1001},
         {100.0, 100, 1},
         {119.88, 120000, 1001},
         {199.0, 199, 1},
-        {200.0, 200, 1},
-        {239.76, 240000, 1001},
         {243.9, 240, 1},
         {244.0, 244, 1},
-        {0.0, 0, 1},
     };
     for (const RateCase& c : cases) {
         _aafRational_t rate{-1, -1};
@@ -74,9 +53,7 @@ TEST(FrameRateTableTest, RationalRateFromFPS) {
 
 TEST(FrameRateTableTest, RationalVideoRateFromFPS) {
     const RateCase cases[] = {
-        {23, 24000, 1001}, {24, 24, 1},     {29, 30000, 1001}, {59, 60000, 1001}, {68, 68, 1},
-        {69, 69, 1},       {71, 72000, 1001}, {72, 72, 1},       {119, 120000, 1001}, {243, 240, 1},
-        {244, 244, 1},     {0, 0, 1},       {-5, -5, 1},       {44100, 44100, 1},
+        {23, 24000, 1001}, {68, 68, 1}, {71, 72000, 1001}, {72, 72, 1}, {243, 240, 1}, {244, 244, 1}, {-5, -5, 1},
     };
     for (const RateCase& c : cases) {
         _aafRational_t rate{-1, -1};
@@ -93,7 +70,6 @@ TEST(FrameRateTableTest, StringToFrameRateReadsTheNumberAndTheDropMark) {
         bool drop;
     };
     const Case cases[] = {
-        {"29.97", 30000, 1001, false},
         {"29", 30000, 1001, false},
         {"29.97DF", 30000, 1001, true},
         {"29.97df", 30000, 1001, true},
@@ -105,11 +81,9 @@ TEST(FrameRateTableTest, StringToFrameRateReadsTheNumberAndTheDropMark) {
         {"30DF", 30, 1, true},
         {"59.94DF", 60000, 1001, true},
         {"23.976", 24000, 1001, false},
-        {"24.5", 24, 1, false},
         // A rate that cannot be drop frame ignores the mark.
         {"25DF", 25, 1, false},
         {"025.000-ND", 25, 1, false},
-        {"60", 60, 1, false},
     };
     for (const Case& c : cases) {
         SCOPED_TRACE(c.text);
@@ -134,16 +108,14 @@ TEST(FrameRateTableTest, StringToFrameRateRefusesOtherNumbersAndWritesNothing) {
 
 using VideoFormatTest = StartedLibraryTest;
 
-TEST_F(VideoFormatTest, StringToFrameRateFindsTheExactName) {
+TEST_F(VideoFormatTest, StringToFrameRateFindsOnlyTheExactName) {
     struct Case {
         const char* text;
         unsigned short fps;
         bool interlaced;
     };
     const Case cases[] = {
-        {"23.976p", 24, false}, {"24p", 24, false},    {"29.97i", 30, true}, {"30i", 30, true},
-        {"25p", 25, false},     {"25i", 25, true},     {"59.94p", 30, false}, {"59.94i", 30, true},
-        {"50p", 25, false},     {"50i", 25, true},
+        {"23.976p", 24, false}, {"29.97i", 30, true}, {"25i", 25, true}, {"59.94p", 30, false}, {"50p", 25, false},
     };
     for (const Case& c : cases) {
         SCOPED_TRACE(c.text);
@@ -153,12 +125,7 @@ TEST_F(VideoFormatTest, StringToFrameRateFindsTheExactName) {
         EXPECT_EQ(fps, c.fps);
         EXPECT_EQ(interlaced, c.interlaced);
     }
-    // A null output is passed over.
-    EXPECT_TRUE(StringToFrameRate(Text("50i"), nullptr, nullptr));
-}
-
-TEST_F(VideoFormatTest, StringToFrameRateLeavesOutputsForOtherTexts) {
-    for (const char* text : {"50P", "25", "25p ", " 25p", "", "60p"}) {
+    for (const char* text : {"50P", "25", " 25p", "", "60p"}) {
         SCOPED_TRACE(text);
         unsigned short fps = 99;
         bool interlaced = true;
@@ -166,9 +133,6 @@ TEST_F(VideoFormatTest, StringToFrameRateLeavesOutputsForOtherTexts) {
         EXPECT_EQ(fps, 99);
         EXPECT_TRUE(interlaced);
     }
-    unsigned short fps = 99;
-    EXPECT_FALSE(StringToFrameRate(ZEB::ZEBString(), &fps, nullptr));
-    EXPECT_EQ(fps, 99);
 }
 
 }  // namespace

@@ -13,7 +13,9 @@ protected:
     void TearDown() override { ZEB::ZEBTerminate(); }
 
     /// A string holding `text` in UTF-8.
-    static ZEB::ZEBString Text(const char* text) { return ZEB::ZEBString(reinterpret_cast<const unsigned char*>(text)); }
+    static ZEB::ZEBString Text(const char* text) {
+        return ZEB::ZEBString(reinterpret_cast<const unsigned char*>(text));
+    }
 
     TestHost host;
 };

@@ -24,8 +24,8 @@ TEST(TextHelpersTest, TrimFromBeginningAndEnd) {
         const char* trimmed;
     };
     const Case cases[] = {
-        {"  Roll 7  ", ' ', "Roll 7"}, {"Roll 7", ' ', "Roll 7"}, {"   ", ' ', ""},      {"", ' ', ""},
-        {"\tA\t", ' ', "\tA\t"},       {"xxAxBxx", 'x', "AxB"},   {" a b ", ' ', "a b"},
+        {"  Roll 7  ", ' ', "Roll 7"}, {"   ", ' ', ""},        {"", ' ', ""},
+        {"\tA\t", ' ', "\tA\t"},       {"xxAxBxx", 'x', "AxB"},
     };
     for (const Case& c : cases) EXPECT_EQ(TrimFromBeginningAndEnd(c.text, c.c), c.trimmed) << c.text;
 }
@@ -41,7 +41,6 @@ TEST(TextHelpersTest, GetFullFileNameFromPath) {
         {"/media\\mixed/a.wav", "a.wav"},
         {"/media/folder/", ""},
         {"a.wav", "a.wav"},
-        {"", ""},
     };
     for (const Case& c : cases) EXPECT_EQ(GetFullFileNameFromPath(c.path), c.name) << c.path;
 }

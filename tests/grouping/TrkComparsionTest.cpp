@@ -25,10 +25,10 @@ TEST(TrkComparsionTest, ComparesTheNumberAfterThreeCharacters) {
         bool less;
     };
     const Case cases[] = {
-        {"TRK1", "TRK2", true},   {"TRK2", "TRK1", false}, {"TRK2", "TRK10", true}, {"TRK9", "TRK10", true},
-        {"TRK01", "TRK1", false}, {"TRK1", "TRK01", false}, {"ABC1", "TRK2", true}, {"TRK", "TRK0", false},
-        {"TRK", "TRK1", true},    {"TRKa", "TRK1", false}, {"TRK1", "TRKa", false}, {"TRK1 ", "TRK2", false},
-        {"", "TRK1", false},      {"TRK1", "", false},     {"", "AB", false},
+        {"TRK1", "TRK2", true},   {"TRK2", "TRK1", false},  {"TRK2", "TRK10", true}, {"TRK9", "TRK10", true},
+        {"TRK01", "TRK1", false}, {"TRK1", "TRK01", false}, {"ABC1", "TRK2", true},  {"TRK", "TRK0", false},
+        {"TRK", "TRK1", true},    {"TRKa", "TRK1", false},  {"TRK1", "TRKa", false}, {"TRK1 ", "TRK2", false},
+        {"", "TRK1", false},      {"TRK1", "", false},      {"", "AB", false},
     };
     for (const Case& c : cases) EXPECT_EQ(TrkComparsion(c.a, c.b), c.less) << c.a << " < " << c.b;
 }
