@@ -8,7 +8,9 @@
 #include "clipmodel/FrameRateTable.h"
 #include "clipmodel/GetFileCreationTime.h"
 #include "clipmodel/IsToggleOn.h"
+#include "clipmodel/TextForms.h"
 #include "clipmodel/Timecode.h"
+#include "clipmodel/TruncateToInteger.h"
 #include "reader/ParseOriginationTime.h"
 #include "tov/TOVResult.h"
 
@@ -26,9 +28,13 @@ bool RateFromKeyword(const Chunks::BEXT::BEXTChunk& bext, const char* key, _aafR
 TimeCodeInfo StartFromSamples(unsigned long long samples, double sampleRate, double fps, int fpsInt, bool drop) {
     const Timecode::timecode_t tc =
         Timecode::SamplesToTC(static_cast<long long>(samples), sampleRate, fps, fpsInt, drop, fpsInt, drop);
-    short hours = 0, minutes = 0, seconds = 0, frames = 0;
-    Timecode::TCDeconstruct(tc, nullptr, &hours, &minutes, &seconds, &frames);
-    return TimeCodeInfo(hours, minutes, seconds, frames, tc.desc.fps, (tc.desc.flags & 1) != 0, tc.count);
+    TimeCodeInfo start;
+    TimeCodeToTimeCodeInfo(tc, start);
+    return start;
+}
+
+double FramesPerSecond(const _aafRational_t& rate) {
+    return rate.denominator != 0 ? static_cast<double>(rate.numerator) / rate.denominator : 0.0;
 }
 
 }  // namespace
@@ -37,9 +43,8 @@ bool ChooseFrameRateFromFileAttributes(const Chunks::IXML::IXMLSpeed* speed, con
                                        bool useDropFlag, _aafRational_t& rate, bool& drop, const char** source) {
     if (speed != nullptr && speed->HasTimeCodeRate()) {
         rate = speed->GetTimeCodeRate();
-        const double fps = rate.denominator != 0 ? static_cast<double>(rate.numerator) / rate.denominator : 0.0;
         drop = useDropFlag && speed->HasTimeCodeFlag() && speed->GetTimeCodeFlag() &&
-               Timecode::TCFPSCanBeDF(static_cast<int>(fps + 0.5));
+               Timecode::TCFPSCanBeDF(HelperFunctions::TruncateToInt32(FramesPerSecond(rate) + 0.5));
         if (source != nullptr) *source = "iXML";
         return true;
     }
@@ -113,8 +118,7 @@ void AddTimeCodeFromMetadata(const Chunks::BEXT::BEXTChunk* bext, bool hasBext, 
             hours = minutes = seconds = 0;
             startSource = "set to zero as default";
         }
-        startSamples = static_cast<unsigned long long>(seconds * workingRate + minutes * (workingRate * 60) +
-                                                       hours * (60 * (workingRate * 60)));
+        TimeToSamples(hours, minutes, seconds, workingRate, startSamples);
     }
 
     _aafRational_t rate{25, 1};
@@ -125,8 +129,8 @@ void AddTimeCodeFromMetadata(const Chunks::BEXT::BEXTChunk* bext, bool hasBext, 
         drop = false;
         rateSource = "(No Source)";
     }
-    const double fps = rate.denominator != 0 ? static_cast<double>(rate.numerator) / rate.denominator : 0.0;
-    const int fpsInt = static_cast<int>(fps + 0.5);
+    const double fps = FramesPerSecond(rate);
+    const int fpsInt = HelperFunctions::TruncateToInt32(fps + 0.5);
 
     FrameRateSettings frameRate;
     frameRate.SetRationalFramerate(rate, drop);
