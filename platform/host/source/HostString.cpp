@@ -15,43 +15,48 @@ namespace {
 
 [[noreturn]] void Fail(TOVRESULT result) { throw static_cast<int>(result); }
 
-bool Decode(const unsigned char* text, size_t n, std::u32string& out) { return UnicodeCodec::DecodeUTF8(text, n, out); }
-bool Decode(const unsigned short* text, size_t n, std::u32string& out) {
-    return UnicodeCodec::DecodeUTF16(text, n, out);
-}
-bool Decode(const unsigned int* text, size_t n, std::u32string& out) { return UnicodeCodec::DecodeUTF32(text, n, out); }
-bool Decode(const wchar_t* text, size_t n, std::u32string& out) { return UnicodeCodec::DecodeUTF32(text, n, out); }
+// The text is worked on as it is kept, as wide code points, so that nothing
+// is converted once more on its way in or out.
+bool Decode(const unsigned char* text, size_t n, std::wstring& out) { return UnicodeCodec::DecodeUTF8(text, n, out); }
+bool Decode(const unsigned short* text, size_t n, std::wstring& out) { return UnicodeCodec::DecodeUTF16(text, n, out); }
+bool Decode(const unsigned int* text, size_t n, std::wstring& out) { return UnicodeCodec::DecodeUTF32(text, n, out); }
+bool Decode(const wchar_t* text, size_t n, std::wstring& out) { return UnicodeCodec::DecodeUTF32(text, n, out); }
 
-// Bytes of a UTF-8 input before its first zero within `n`.
-size_t UTF8Length(const unsigned char* text, unsigned int n) {
+// Units of an input before its first zero within `n`.
+template <class Unit>
+size_t LengthWithin(const Unit* text, unsigned int n) {
     size_t length = 0;
     while (length < n && text[length] != 0) ++length;
     return length;
 }
 
+// Bytes are the common input, and long ones (whole documents) come as UTF-8.
+size_t LengthWithin(const unsigned char* text, unsigned int n) {
+    const void* zero = std::memchr(text, 0, n);
+    return zero ? static_cast<size_t>(static_cast<const unsigned char*>(zero) - text) : n;
+}
+
 // Input text: up to `n` units, ending at the first zero.
 template <class Unit>
-std::u32string ReadText(const Unit* text, unsigned int n) {
+std::wstring ReadText(const Unit* text, unsigned int n) {
     if (!text) {
         if (n > 1) Fail(TOV_E_INVALIDARG);
         return {};
     }
-    size_t length = 0;
-    while (length < n && text[length] != 0) ++length;
-    std::u32string decoded;
-    if (!Decode(text, length, decoded)) Fail(TOV_E_INVALIDARG);
+    std::wstring decoded;
+    if (!Decode(text, LengthWithin(text, n), decoded)) Fail(TOV_E_INVALIDARG);
     return decoded;
 }
 
 // The zero-terminated text at the start of a caller's buffer, which may be unaligned.
 template <class Unit>
-std::u32string ReadBuffer(const unsigned char* buffer, unsigned int size) {
+std::wstring ReadBuffer(const unsigned char* buffer, unsigned int size) {
     std::vector<Unit> units;
     for (size_t offset = 0; offset + sizeof(Unit) <= size; offset += sizeof(Unit)) {
         Unit unit;
         std::memcpy(&unit, buffer + offset, sizeof unit);
         if (unit == 0) {
-            std::u32string decoded;
+            std::wstring decoded;
             if (!Decode(units.data(), units.size(), decoded)) Fail(TOV_E_INVALIDARG);
             return decoded;
         }
@@ -91,14 +96,14 @@ locale_t CaseLocale() {
     return locale;
 }
 
-std::u32string ChangeCase(std::u32string text, bool upper) {
+std::wstring ChangeCase(std::wstring text, bool upper) {
     const locale_t locale = CaseLocale();
-    for (char32_t& cp : text) cp = upper ? towupper_l(cp, locale) : towlower_l(cp, locale);
+    for (wchar_t& cp : text) cp = static_cast<wchar_t>(upper ? towupper_l(cp, locale) : towlower_l(cp, locale));
     return text;
 }
 
 // Upper then lower also joins letters with several lower forms (final sigma, long s).
-std::u32string Folded(std::u32string text) { return ChangeCase(ChangeCase(std::move(text), true), false); }
+std::wstring Folded(std::wstring text) { return ChangeCase(ChangeCase(std::move(text), true), false); }
 
 }  // namespace
 
@@ -127,7 +132,7 @@ TOVRESULT HostString::Assign(_tovUnicodeType type, const unsigned char* text, un
         // the UTF-8 view as it stands: large texts handed in and read back as
         // UTF-8 (XML documents) are not encoded again.
         if (result >= 0 && text) {
-            m_UTF8.assign(reinterpret_cast<const char*>(text), m_Text.empty() ? 0 : UTF8Length(text, n));
+            m_UTF8.assign(reinterpret_cast<const char*>(text), m_Text.empty() ? 0 : LengthWithin(text, n));
             m_UTF8Fresh = true;
         }
         return result;
@@ -146,14 +151,23 @@ TOVRESULT HostString::Assign(_tovUnicodeType type, const wchar_t* text, unsigned
     return TOVGuarded([&] { return AssignText(type, ReadText(text, n)); });
 }
 
-TOVRESULT HostString::AssignText(_tovUnicodeType type, const std::u32string& text) {
+TOVRESULT HostString::AssignText(_tovUnicodeType type, std::wstring text) {
     if (!IsKnownType(type)) return TOV_E_INVALIDARG;
-    Commit(text, type);
+    Commit(std::move(text), type);
     return TOV_OK;
 }
 
 TOVRESULT HostString::ConvertTo(_tovUnicodeType type) {
-    return TOVGuarded([&] { return AssignText(type, CodePoints()); });
+    return TOVGuarded([&] {
+        // The stored encoding names only the form the counts and an external
+        // buffer use: with no buffer to rewrite, and no writes through the
+        // wide storage to clean up, the code points and their views stand.
+        if (IsKnownType(type) && !m_External && !m_WideHandedOut) {
+            m_Type = type;
+            return TOV_OK;
+        }
+        return AssignText(type, CodePoints());
+    });
 }
 
 TOVRESULT HostString::ToLower() {
@@ -203,14 +217,14 @@ TOVRESULT HostString::Append(const wchar_t* text, unsigned int n) {
     return TOVGuarded([&] { return AppendText(ReadText(text, n)); });
 }
 
-TOVRESULT HostString::AppendText(const std::u32string& text) {
+TOVRESULT HostString::AppendText(const std::wstring& text) {
     Commit(CodePoints() + text, m_Type);
     return TOV_OK;
 }
 
 TOVRESULT HostString::Clear() {
     return TOVGuarded([&] {
-        Commit(std::u32string(), m_Type);
+        Commit(std::wstring(), m_Type);
         return TOV_OK;
     });
 }
@@ -222,15 +236,14 @@ TOVRESULT HostString::Truncate(unsigned int count) {
     });
 }
 
-void HostString::Commit(const std::u32string& text, _tovUnicodeType type) {
+void HostString::Commit(std::wstring text, _tovUnicodeType type) {
     // Everything that can fail happens before the first change.
-    std::wstring stored(text.begin(), text.end());
     if (m_External) {
         const std::vector<unsigned char> bytes = EncodeBytes(text, type);
         if (bytes.size() > m_ExternalSize) Fail(TOV_E_OUTOFRANGE);
         std::memcpy(m_External, bytes.data(), bytes.size());
     }
-    m_Text.swap(stored);
+    m_Text.swap(text);
     m_Type = type;
     m_UTF8Fresh = m_UTF16Fresh = m_UTF32Fresh = false;
     m_WideHandedOut = false;  // the storage handed out is no longer valid
@@ -252,7 +265,7 @@ TOVRESULT HostString::GetUTF16String(const unsigned short** out) {
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
         if (!m_UTF16Fresh || m_WideHandedOut) {
-            std::vector<unsigned short> units = UnicodeCodec::EncodeUTF16(CodePoints());
+            std::vector<unsigned short> units = UnicodeCodec::EncodeUTF16(std::wstring_view(m_Text));
             units.push_back(0);
             Refresh(m_UTF16, std::move(units));
         }
@@ -266,7 +279,7 @@ TOVRESULT HostString::GetUTF32String(const unsigned int** out) {
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
         if (!m_UTF32Fresh || m_WideHandedOut) {
-            std::vector<unsigned int> units = UnicodeCodec::EncodeUTF32(CodePoints());
+            std::vector<unsigned int> units = UnicodeCodec::EncodeUTF32(std::wstring_view(m_Text));
             units.push_back(0);
             Refresh(m_UTF32, std::move(units));
         }
@@ -300,24 +313,23 @@ uint32_t HostString::GetByteCount() {
 
 uint32_t HostString::GetNumCharacters() { return static_cast<uint32_t>(m_Text.size()); }
 
-std::u32string HostString::CodePoints() const {
-    std::u32string text;
-    text.reserve(m_Text.size());
-    for (wchar_t wc : m_Text) {
-        const auto value = static_cast<uint32_t>(wc);
-        text += UnicodeCodec::IsScalarValue(value) ? static_cast<char32_t>(value) : UnicodeCodec::kReplacement;
+std::wstring HostString::CodePoints() const {
+    std::wstring text(m_Text);
+    for (wchar_t& wc : text) {
+        if (!UnicodeCodec::IsScalarValue(static_cast<uint32_t>(wc)))
+            wc = static_cast<wchar_t>(UnicodeCodec::kReplacement);
     }
     return text;
 }
 
-std::u32string HostString::TextOf(ITOVString* source) {
+std::wstring HostString::TextOf(ITOVString* source) {
     if (!source) Fail(TOV_E_INVALIDARG);
     // Between two strings of this host, the code points are at hand.
     if (auto* same = dynamic_cast<HostString*>(source)) return same->CodePoints();
     const unsigned int* units = nullptr;
     TOVCheck(source->GetUTF32String(&units));
     if (!units) Fail(TOV_E_POINTER);
-    std::u32string text;
+    std::wstring text;
     if (!UnicodeCodec::DecodeUTF32(units, source->GetNumCharacters(), text)) Fail(TOV_E_INVALIDARG);
     return text;
 }
@@ -344,7 +356,7 @@ TOVRESULT HostString::Compare(const wchar_t* text, unsigned int n, int* result, 
     return TOVGuarded([&] { return CompareText(ReadText(text, n), result, caseSensitive); });
 }
 
-TOVRESULT HostString::CompareText(const std::u32string& other, int* result, int caseSensitive) const {
+TOVRESULT HostString::CompareText(const std::wstring& other, int* result, int caseSensitive) const {
     if (!result) return TOV_E_INVALIDARG;
     const int order = caseSensitive ? CodePoints().compare(other) : Folded(CodePoints()).compare(Folded(other));
     *result = order < 0 ? -1 : order > 0 ? 1 : 0;
@@ -391,18 +403,18 @@ TOVRESULT HostString::FindStringReverse(const wchar_t* text, unsigned int n, int
     return TOVGuarded([&] { return FindTextReverse(ReadText(text, n), start, position); });
 }
 
-TOVRESULT HostString::FindText(const std::u32string& needle, int start, int* position) const {
+TOVRESULT HostString::FindText(const std::wstring& needle, int start, int* position) const {
     if (!position) return TOV_E_INVALIDARG;
     const size_t found = CodePoints().find(needle, start < 0 ? 0 : static_cast<size_t>(start));
-    *position = found == std::u32string::npos ? -1 : static_cast<int>(found);
+    *position = found == std::wstring::npos ? -1 : static_cast<int>(found);
     return TOV_OK;
 }
 
-TOVRESULT HostString::FindTextReverse(const std::u32string& needle, int start, int* position) const {
+TOVRESULT HostString::FindTextReverse(const std::wstring& needle, int start, int* position) const {
     if (!position) return TOV_E_INVALIDARG;
     // A start at or past the end already searches from the end.
-    const size_t found = CodePoints().rfind(needle, start < 0 ? std::u32string::npos : static_cast<size_t>(start));
-    *position = found == std::u32string::npos ? -1 : static_cast<int>(found);
+    const size_t found = CodePoints().rfind(needle, start < 0 ? std::wstring::npos : static_cast<size_t>(start));
+    *position = found == std::wstring::npos ? -1 : static_cast<int>(found);
     return TOV_OK;
 }
 
@@ -411,21 +423,21 @@ TOVRESULT HostString::FindTextReverse(const std::u32string& needle, int start, i
 TOVRESULT HostString::GetCharacter(unsigned int index, unsigned char* out, unsigned int* size) {
     return TOVGuarded([&] {
         if (!out || !size) return TOV_E_INVALIDARG;
-        return CopyUnits(UnicodeCodec::EncodeUTF8(std::u32string(1, CharacterAt(index))), out, size);
+        return CopyUnits(UnicodeCodec::EncodeUTF8(std::wstring(1, CharacterAt(index))), out, size);
     });
 }
 
 TOVRESULT HostString::GetCharacter(unsigned int index, unsigned short* out, unsigned int* size) {
     return TOVGuarded([&] {
         if (!out || !size) return TOV_E_INVALIDARG;
-        return CopyUnits(UnicodeCodec::EncodeUTF16(std::u32string(1, CharacterAt(index))), out, size);
+        return CopyUnits(UnicodeCodec::EncodeUTF16(std::wstring(1, CharacterAt(index))), out, size);
     });
 }
 
 TOVRESULT HostString::GetCharacter(unsigned int index, unsigned int* codePoint) {
     return TOVGuarded([&] {
         if (!codePoint) return TOV_E_INVALIDARG;
-        *codePoint = CharacterAt(index);
+        *codePoint = static_cast<unsigned int>(CharacterAt(index));
         return TOV_OK;
     });
 }
@@ -442,19 +454,20 @@ TOVRESULT HostString::SetCharacter(unsigned int index, unsigned int codePoint) {
     return TOVGuarded([&] { return SetCharacterText(index, ReadText(&codePoint, 1)); });
 }
 
-TOVRESULT HostString::SetCharacterText(unsigned int index, const std::u32string& character) {
+TOVRESULT HostString::SetCharacterText(unsigned int index, const std::wstring& character) {
     if (index >= m_Text.size()) return TOV_E_OUTOFRANGE;
     if (character.size() != 1) return TOV_E_INVALIDARG;
-    std::u32string text = CodePoints();
+    std::wstring text = CodePoints();
     text[index] = character[0];
-    Commit(text, m_Type);
+    Commit(std::move(text), m_Type);
     return TOV_OK;
 }
 
-char32_t HostString::CharacterAt(unsigned int index) const {
+wchar_t HostString::CharacterAt(unsigned int index) const {
     if (index >= m_Text.size()) Fail(TOV_E_OUTOFRANGE);
-    const auto value = static_cast<uint32_t>(m_Text[index]);
-    return UnicodeCodec::IsScalarValue(value) ? static_cast<char32_t>(value) : UnicodeCodec::kReplacement;
+    const wchar_t value = m_Text[index];
+    return UnicodeCodec::IsScalarValue(static_cast<uint32_t>(value)) ? value
+                                                                     : static_cast<wchar_t>(UnicodeCodec::kReplacement);
 }
 
 // ---- External storage
@@ -463,7 +476,7 @@ TOVRESULT HostString::SetExternalBuffer(_tovUnicodeType type, unsigned char* buf
     return TOVGuarded([&] {
         if (!buffer || !IsKnownType(type)) return TOV_E_INVALIDARG;
         if (m_External) return ZEB_E_ALREADYSET;
-        std::u32string text;
+        std::wstring text;
         if (type == kTOVUnicodeUTF8) {
             text = ReadBuffer<unsigned char>(buffer, size);
         } else if (type == kTOVUnicodeUTF16) {
@@ -472,7 +485,7 @@ TOVRESULT HostString::SetExternalBuffer(_tovUnicodeType type, unsigned char* buf
             text = ReadBuffer<unsigned int>(buffer, size);
         }
         // The buffer already holds this text, so it is only adopted afterwards.
-        Commit(text, type);
+        Commit(std::move(text), type);
         m_External = buffer;
         m_ExternalSize = size;
         return TOV_OK;
@@ -488,7 +501,7 @@ TOVRESULT HostString::RemoveExternalBuffer(unsigned char** buffer) {
     return TOV_OK;
 }
 
-std::vector<unsigned char> HostString::EncodeBytes(const std::u32string& text, _tovUnicodeType type) {
+std::vector<unsigned char> HostString::EncodeBytes(const std::wstring& text, _tovUnicodeType type) {
     if (type == kTOVUnicodeUTF8) {
         const std::string units = UnicodeCodec::EncodeUTF8(text);
         return TerminatedBytes(std::vector<unsigned char>(units.begin(), units.end()));

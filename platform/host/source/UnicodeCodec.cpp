@@ -35,14 +35,38 @@ std::string EncodeUTF8Of(const CodePoint* text, size_t n) {
     return out;
 }
 
-template <class Unit>
-bool DecodeUTF32Of(const Unit* text, size_t n, std::u32string& out) {
-    std::u32string decoded;
-    decoded.reserve(n);
+template <class CodePoint>
+std::vector<unsigned short> EncodeUTF16Of(const CodePoint* text, size_t n) {
+    std::vector<unsigned short> out;
+    out.reserve(n);
+    for (size_t i = 0; i < n; ++i) {
+        const char32_t cp = Scalar(static_cast<uint32_t>(text[i]));
+        if (cp < 0x10000) {
+            out.push_back(static_cast<unsigned short>(cp));
+        } else {
+            out.push_back(static_cast<unsigned short>(0xD800 + ((cp - 0x10000) >> 10)));
+            out.push_back(static_cast<unsigned short>(0xDC00 + ((cp - 0x10000) & 0x3FF)));
+        }
+    }
+    return out;
+}
+
+template <class CodePoint>
+std::vector<unsigned int> EncodeUTF32Of(const CodePoint* text, size_t n) {
+    std::vector<unsigned int> out(n);
+    for (size_t i = 0; i < n; ++i) out[i] = Scalar(static_cast<uint32_t>(text[i]));
+    return out;
+}
+
+// The decoders write into a text sized for the most code points the input can
+// hold, one per unit, and cut it to what was written: no growing on the way.
+template <class Text, class Unit>
+bool DecodeUTF32Of(const Unit* text, size_t n, Text& out) {
+    Text decoded(n, 0);
     for (size_t i = 0; i < n; ++i) {
         const auto value = static_cast<uint32_t>(text[i]);
         if (!UnicodeCodec::IsScalarValue(value)) return false;
-        decoded += static_cast<char32_t>(value);
+        decoded[i] = static_cast<typename Text::value_type>(value);
     }
     out = std::move(decoded);
     return true;
@@ -52,9 +76,11 @@ bool DecodeUTF32Of(const Unit* text, size_t n, std::u32string& out) {
 
 bool UnicodeCodec::IsScalarValue(uint32_t value) { return value <= 0x10FFFF && (value < 0xD800 || value > 0xDFFF); }
 
-bool UnicodeCodec::DecodeUTF8(const unsigned char* text, size_t n, std::u32string& out) {
-    std::u32string decoded;
-    decoded.reserve(n);
+template <class Text>
+bool UnicodeCodec::DecodeUTF8(const unsigned char* text, size_t n, Text& out) {
+    using CodePoint = typename Text::value_type;
+    Text decoded(n, 0);
+    CodePoint* next = decoded.data();
     size_t i = 0;
     while (i < n) {
         const unsigned char lead = text[i];
@@ -62,7 +88,7 @@ bool UnicodeCodec::DecodeUTF8(const unsigned char* text, size_t n, std::u32strin
         uint32_t cp;
         uint32_t minimum;
         if (lead < 0x80) {
-            decoded += static_cast<char32_t>(lead);
+            *next++ = static_cast<CodePoint>(lead);
             ++i;
             continue;
         }
@@ -82,64 +108,73 @@ bool UnicodeCodec::DecodeUTF8(const unsigned char* text, size_t n, std::u32strin
         }
         // Overlong forms, encoded surrogates and values past 0x10FFFF.
         if (cp < minimum || !IsScalarValue(cp)) return false;
-        decoded += static_cast<char32_t>(cp);
+        *next++ = static_cast<CodePoint>(cp);
         i += length;
     }
+    decoded.resize(static_cast<size_t>(next - decoded.data()));
     out = std::move(decoded);
     return true;
 }
 
-bool UnicodeCodec::DecodeUTF16(const unsigned short* text, size_t n, std::u32string& out) {
-    std::u32string decoded;
-    decoded.reserve(n);
+template <class Text>
+bool UnicodeCodec::DecodeUTF16(const unsigned short* text, size_t n, Text& out) {
+    using CodePoint = typename Text::value_type;
+    Text decoded(n, 0);
+    CodePoint* next = decoded.data();
     for (size_t i = 0; i < n; ++i) {
         const uint32_t unit = text[i];
         if (unit < 0xD800 || unit > 0xDFFF) {
-            decoded += static_cast<char32_t>(unit);
+            *next++ = static_cast<CodePoint>(unit);
             continue;
         }
         if (unit > 0xDBFF || i + 1 == n) return false;  // a lone low half, or a high half at the end
         const uint32_t low = text[i + 1];
         if (low < 0xDC00 || low > 0xDFFF) return false;
-        decoded += static_cast<char32_t>(0x10000 + ((unit - 0xD800) << 10) + (low - 0xDC00));
+        *next++ = static_cast<CodePoint>(0x10000 + ((unit - 0xD800) << 10) + (low - 0xDC00));
         ++i;
     }
+    decoded.resize(static_cast<size_t>(next - decoded.data()));
     out = std::move(decoded);
     return true;
 }
 
-bool UnicodeCodec::DecodeUTF32(const unsigned int* text, size_t n, std::u32string& out) {
+template <class Text>
+bool UnicodeCodec::DecodeUTF32(const unsigned int* text, size_t n, Text& out) {
     return DecodeUTF32Of(text, n, out);
 }
 
-bool UnicodeCodec::DecodeUTF32(const wchar_t* text, size_t n, std::u32string& out) {
+template <class Text>
+bool UnicodeCodec::DecodeUTF32(const wchar_t* text, size_t n, Text& out) {
     return DecodeUTF32Of(text, n, out);
 }
+
+template bool UnicodeCodec::DecodeUTF8(const unsigned char*, size_t, std::u32string&);
+template bool UnicodeCodec::DecodeUTF8(const unsigned char*, size_t, std::wstring&);
+template bool UnicodeCodec::DecodeUTF16(const unsigned short*, size_t, std::u32string&);
+template bool UnicodeCodec::DecodeUTF16(const unsigned short*, size_t, std::wstring&);
+template bool UnicodeCodec::DecodeUTF32(const unsigned int*, size_t, std::u32string&);
+template bool UnicodeCodec::DecodeUTF32(const unsigned int*, size_t, std::wstring&);
+template bool UnicodeCodec::DecodeUTF32(const wchar_t*, size_t, std::u32string&);
+template bool UnicodeCodec::DecodeUTF32(const wchar_t*, size_t, std::wstring&);
 
 std::string UnicodeCodec::EncodeUTF8(std::u32string_view text) { return EncodeUTF8Of(text.data(), text.size()); }
 
 std::string UnicodeCodec::EncodeUTF8(std::wstring_view text) { return EncodeUTF8Of(text.data(), text.size()); }
 
 std::vector<unsigned short> UnicodeCodec::EncodeUTF16(std::u32string_view text) {
-    std::vector<unsigned short> out;
-    out.reserve(text.size());
-    for (char32_t value : text) {
-        const char32_t cp = Scalar(value);
-        if (cp < 0x10000) {
-            out.push_back(static_cast<unsigned short>(cp));
-        } else {
-            out.push_back(static_cast<unsigned short>(0xD800 + ((cp - 0x10000) >> 10)));
-            out.push_back(static_cast<unsigned short>(0xDC00 + ((cp - 0x10000) & 0x3FF)));
-        }
-    }
-    return out;
+    return EncodeUTF16Of(text.data(), text.size());
+}
+
+std::vector<unsigned short> UnicodeCodec::EncodeUTF16(std::wstring_view text) {
+    return EncodeUTF16Of(text.data(), text.size());
 }
 
 std::vector<unsigned int> UnicodeCodec::EncodeUTF32(std::u32string_view text) {
-    std::vector<unsigned int> out;
-    out.reserve(text.size());
-    for (char32_t value : text) out.push_back(Scalar(value));
-    return out;
+    return EncodeUTF32Of(text.data(), text.size());
+}
+
+std::vector<unsigned int> UnicodeCodec::EncodeUTF32(std::wstring_view text) {
+    return EncodeUTF32Of(text.data(), text.size());
 }
 
 size_t UnicodeCodec::UTF8Length(char32_t codePoint) {

@@ -218,6 +218,11 @@ TEST_F(HostStringTest, ViewsStayPutUntilTheTextChanges) {
     EXPECT_EQ(reinterpret_cast<const char*>(utf8), utf8Text);
     EXPECT_EQ(utf16[3], 0xD83D);
     EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF16);
+    ASSERT_EQ(s->ConvertTo(kTOVUnicodeUTF8), TOV_OK);  // the encoding, not the text
+    ASSERT_EQ(s->GetUTF8String(&utf8Again), TOV_OK);
+    ASSERT_EQ(s->GetUTF16String(&utf16Again), TOV_OK);
+    EXPECT_EQ(utf8Again, utf8);
+    EXPECT_EQ(utf16Again, utf16);
     EXPECT_EQ(s->Append(L"!", 1), TOV_OK);
     EXPECT_EQ(UTF8Of(s.Get()), utf8Text + "!");
 }
@@ -234,6 +239,10 @@ TEST_F(HostStringTest, WideStorageCanBeRewrittenInPlace) {
     unsigned int cp = 0;
     EXPECT_EQ(s->GetCharacter(1, &cp), TOV_OK);
     EXPECT_EQ(cp, 0xFFFDu);
+    // Converting stores what the views read, and counts follow the new encoding.
+    ASSERT_EQ(s->ConvertTo(kTOVUnicodeUTF8), TOV_OK);
+    EXPECT_EQ(WideOf(s.Get()), U"B�€😀");
+    EXPECT_EQ(s->GetCodePointCount(), 1u + 3 + 3 + 4);
 }
 
 int Sign(int value) { return (value > 0) - (value < 0); }

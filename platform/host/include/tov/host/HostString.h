@@ -107,24 +107,24 @@ public:
 
 private:
     /// The text with every non-scalar value replaced by U+FFFD.
-    std::u32string CodePoints() const;
+    std::wstring CodePoints() const;
     /// Makes `text` the string's text in encoding `type`, or throws
     /// TOV_E_OUTOFRANGE when an external buffer cannot hold it; all or nothing.
-    void Commit(const std::u32string& text, _tovUnicodeType type);
-    TOVRESULT AssignText(_tovUnicodeType type, const std::u32string& text);
-    TOVRESULT AppendText(const std::u32string& text);
-    TOVRESULT CompareText(const std::u32string& other, int* result, int caseSensitive) const;
-    TOVRESULT FindText(const std::u32string& needle, int start, int* position) const;
-    TOVRESULT FindTextReverse(const std::u32string& needle, int start, int* position) const;
-    TOVRESULT SetCharacterText(unsigned int index, const std::u32string& character);
+    void Commit(std::wstring text, _tovUnicodeType type);
+    TOVRESULT AssignText(_tovUnicodeType type, std::wstring text);
+    TOVRESULT AppendText(const std::wstring& text);
+    TOVRESULT CompareText(const std::wstring& other, int* result, int caseSensitive) const;
+    TOVRESULT FindText(const std::wstring& needle, int start, int* position) const;
+    TOVRESULT FindTextReverse(const std::wstring& needle, int start, int* position) const;
+    TOVRESULT SetCharacterText(unsigned int index, const std::wstring& character);
     /// The character at `index`, or throws TOV_E_OUTOFRANGE.
-    char32_t CharacterAt(unsigned int index) const;
+    wchar_t CharacterAt(unsigned int index) const;
 
     /// The text of another string, which may be this one.
-    static std::u32string TextOf(ITOVString* source);
+    static std::wstring TextOf(ITOVString* source);
     static bool IsKnownType(_tovUnicodeType type);
     /// `text` in encoding `type`, terminator included, as raw native-order bytes.
-    static std::vector<unsigned char> EncodeBytes(const std::u32string& text, _tovUnicodeType type);
+    static std::vector<unsigned char> EncodeBytes(const std::wstring& text, _tovUnicodeType type);
 
     std::wstring m_Text;
     _tovUnicodeType m_Type = kTOVUnicodeWCHAR;

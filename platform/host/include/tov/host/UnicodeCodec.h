@@ -21,18 +21,25 @@ public:
     /// Whether `value` is at most 0x10FFFF and not a surrogate.
     static bool IsScalarValue(uint32_t value);
 
-    /// Replace `out` by the code points of the `n` units at `text`.
-    static bool DecodeUTF8(const unsigned char* text, size_t n, std::u32string& out);
-    static bool DecodeUTF16(const unsigned short* text, size_t n, std::u32string& out);
-    static bool DecodeUTF32(const unsigned int* text, size_t n, std::u32string& out);
-    /// wchar_t is 32 bits here and holds UTF-32.
-    static bool DecodeUTF32(const wchar_t* text, size_t n, std::u32string& out);
+    /// Replace `out` by the code points of the `n` units at `text`. `Text` is
+    /// std::u32string or std::wstring: wchar_t is 32 bits here and holds
+    /// UTF-32, so both hold code points.
+    template <class Text>
+    static bool DecodeUTF8(const unsigned char* text, size_t n, Text& out);
+    template <class Text>
+    static bool DecodeUTF16(const unsigned short* text, size_t n, Text& out);
+    template <class Text>
+    static bool DecodeUTF32(const unsigned int* text, size_t n, Text& out);
+    template <class Text>
+    static bool DecodeUTF32(const wchar_t* text, size_t n, Text& out);
 
     /// No terminator is added.
     static std::string EncodeUTF8(std::u32string_view text);
     static std::string EncodeUTF8(std::wstring_view text);
     static std::vector<unsigned short> EncodeUTF16(std::u32string_view text);
+    static std::vector<unsigned short> EncodeUTF16(std::wstring_view text);
     static std::vector<unsigned int> EncodeUTF32(std::u32string_view text);
+    static std::vector<unsigned int> EncodeUTF32(std::wstring_view text);
 
     /// Units that `codePoint` takes once encoded (a non-scalar value counts as U+FFFD).
     static size_t UTF8Length(char32_t codePoint);
