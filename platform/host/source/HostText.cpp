@@ -6,7 +6,7 @@
 
 namespace HostText {
 
-TOVRESULT Make(const std::string& utf8, ITOVString** out) {
+TOVRESULT Make(std::string_view utf8, ITOVString** out) {
     if (!out) return TOV_E_INVALIDARG;
     *out = nullptr;
     TOVPtr<ITOVString> text;
@@ -20,14 +20,16 @@ TOVRESULT Make(const std::string& utf8, ITOVString** out) {
     return TOV_OK;
 }
 
-std::string Read(ITOVString* text) {
+std::string Read(ITOVString* text) { return std::string(View(text)); }
+
+std::string_view View(ITOVString* text) {
     if (!text) throw static_cast<int>(TOV_E_POINTER);
     // The UTF-8 view leaves the stored encoding alone, and the text holds no
     // zero, so the view's terminator marks its end.
     const unsigned char* bytes = nullptr;
     TOVCheck(text->GetUTF8String(&bytes));
     if (!bytes) throw static_cast<int>(TOV_E_POINTER);
-    return std::string(reinterpret_cast<const char*>(bytes));
+    return reinterpret_cast<const char*>(bytes);
 }
 
 }  // namespace HostText

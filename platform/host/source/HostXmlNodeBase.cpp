@@ -1,6 +1,7 @@
 #include "tov/host/HostXmlNodeBase.h"
 
 #include <string>
+#include <string_view>
 
 #include "tov/host/HostText.h"
 #include "tov/host/HostXmlDomAttribute.h"
@@ -12,17 +13,21 @@
 
 namespace {
 
-std::string QualifiedName(xmlNodePtr node) {
-    std::string name = node->name ? reinterpret_cast<const char*>(node->name) : "";
-    if (node->ns && node->ns->prefix) name = std::string(reinterpret_cast<const char*>(node->ns->prefix)) + ":" + name;
-    return name;
+// Names and texts are read where libxml2 keeps them; `storage` holds the few
+// that must be put together or freed first.
+std::string_view Text(const xmlChar* text) { return text ? reinterpret_cast<const char*>(text) : ""; }
+
+std::string_view QualifiedName(xmlNodePtr node, std::string& storage) {
+    if (!node->ns || !node->ns->prefix) return Text(node->name);
+    storage = std::string(Text(node->ns->prefix)) + ":" + std::string(Text(node->name));
+    return storage;
 }
 
-std::string NodeName(xmlNodePtr node) {
+std::string_view NodeName(xmlNodePtr node, std::string& storage) {
     switch (node->type) {
         case XML_ELEMENT_NODE:
         case XML_ATTRIBUTE_NODE:
-            return QualifiedName(node);
+            return QualifiedName(node, storage);
         case XML_TEXT_NODE:
             return "#text";
         case XML_CDATA_SECTION_NODE:
@@ -30,19 +35,19 @@ std::string NodeName(xmlNodePtr node) {
         case XML_COMMENT_NODE:
             return "#comment";
         default:
-            return node->name ? reinterpret_cast<const char*>(node->name) : "";
+            return Text(node->name);
     }
 }
 
-std::string NodeValue(xmlDocPtr document, xmlNodePtr node) {
+std::string_view NodeValue(xmlDocPtr document, xmlNodePtr node, std::string& storage) {
     if (node->type == XML_ATTRIBUTE_NODE) {
         xmlChar* value = xmlNodeListGetString(document, node->children, 1);
-        std::string text = value ? reinterpret_cast<const char*>(value) : "";
+        storage = Text(value);
         xmlFree(value);
-        return text;
+        return storage;
     }
-    if (node->type == XML_ELEMENT_NODE || !node->content) return std::string();
-    return reinterpret_cast<const char*>(node->content);
+    if (node->type == XML_ELEMENT_NODE) return "";
+    return Text(node->content);
 }
 
 template <class View>
@@ -73,20 +78,30 @@ TOVRESULT Wrap(const HostXmlDocumentRef& document, xmlNodePtr node, UTIL::ITOVXm
 
 template <class Interface, const _tovUID& ViewIID>
 TOVRESULT HostXmlNodeBase<Interface, ViewIID>::GetName(ITOVString** out) {
-    return TOVGuarded([&] { return HostText::Make(NodeName(m_Node), out); });
+    return TOVGuarded([&] {
+        std::string storage;
+        return HostText::Make(NodeName(m_Node, storage), out);
+    });
 }
 
 template <class Interface, const _tovUID& ViewIID>
 TOVRESULT HostXmlNodeBase<Interface, ViewIID>::GetValue(ITOVString** out) {
-    return TOVGuarded([&] { return HostText::Make(NodeValue(m_Document.get(), m_Node), out); });
+    return TOVGuarded([&] {
+        std::string storage;
+        return HostText::Make(NodeValue(m_Document.get(), m_Node, storage), out);
+    });
 }
 
 template <class Interface, const _tovUID& ViewIID>
 const std::vector<xmlNodePtr>& HostXmlNodeBase<Interface, ViewIID>::Children() {
     if (!m_HaveChildren) {
         // Attributes are not children, and an attribute's own children are its value.
-        if (m_Node->type != XML_ATTRIBUTE_NODE)
+        if (m_Node->type != XML_ATTRIBUTE_NODE) {
+            size_t count = 0;
+            for (xmlNodePtr child = m_Node->children; child; child = child->next) ++count;
+            m_Children.reserve(count);
             for (xmlNodePtr child = m_Node->children; child; child = child->next) m_Children.push_back(child);
+        }
         m_HaveChildren = true;
     }
     return m_Children;

@@ -23,10 +23,10 @@ TOVRESULT HostXmlParser::ParseFile(ITOVString* path) {
 
 TOVRESULT HostXmlParser::ParseText(ITOVString* text) {
     // Text handed over as a string is Unicode already, whatever its declaration says.
-    return TOVGuarded([&] { return Parse(HostText::Read(text), nullptr, "UTF-8"); });
+    return TOVGuarded([&] { return Parse(HostText::View(text), nullptr, "UTF-8"); });
 }
 
-TOVRESULT HostXmlParser::Parse(const std::string& bytes, const char* url, const char* encoding) {
+TOVRESULT HostXmlParser::Parse(std::string_view bytes, const char* url, const char* encoding) {
     m_Document.reset();
     m_LastError.clear();
     if (bytes.size() > LibXmlSafety::kMaxDocumentBytes) {

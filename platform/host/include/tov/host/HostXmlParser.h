@@ -1,6 +1,7 @@
 #pragma once
 /// The host's DOM reader over libxml2 (CompID_TOVXmlReader).
 #include <string>
+#include <string_view>
 
 #include "tov/ITOVXmlParser.h"
 #include "tov/host/HostXmlNodeBase.h"
@@ -21,7 +22,7 @@ public:
 
 private:
     /// `encoding` overrides the document's declaration when not null.
-    TOVRESULT Parse(const std::string& bytes, const char* url, const char* encoding);
+    TOVRESULT Parse(std::string_view bytes, const char* url, const char* encoding);
 
     HostXmlDocumentRef m_Document;
     std::string m_LastError;
