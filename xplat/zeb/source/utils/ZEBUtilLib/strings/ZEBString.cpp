@@ -1,5 +1,7 @@
 #include "strings/ZEBString.h"
 
+#include <cstring>
+
 #include "startup/ZEBUtilLib.h"
 #include "tov/sdk/TOVFailureStyle.h"
 
@@ -12,6 +14,11 @@ unsigned int UnitsBeforeTerminator(const Unit* text) {
     unsigned int n = 0;
     while (text[n] != 0) ++n;
     return n;
+}
+
+// UTF-8 is the common form, and the one long texts (documents) come in.
+unsigned int UnitsBeforeTerminator(const unsigned char* text) {
+    return static_cast<unsigned int>(std::strlen(reinterpret_cast<const char*>(text)));
 }
 
 // Counts for text handed over without a count: the null pointer goes on as
