@@ -53,25 +53,32 @@ TEST_F(XmlElement, TextFollowsChangedAndDeletedPieces) {
 }
 
 TEST_F(XmlElement, ChildElementsAreFoundByExactTagPastComments) {
-    auto doc = Parse("<R><!--c--><X>1</X><Y>y</Y><X>2</X><x>3</x></R>");
+    auto doc = Parse("<R><!--c--><X>1</X><Y>y</Y><X>2</X><x>3</x><\xc3\x9c>4</\xc3\x9c></R>");
     ZEBXmlElement* root = doc->DocumentElement();
     const struct {
         const char* tag;
         unsigned int index;
         const char* text;  // null: no such element
     } cases[] = {
-        {"X", 0, "1"}, {"X", 1, "2"}, {"X", 2, nullptr}, {"x", 0, "3"}, {"", 1, "y"}, {"", 4, nullptr},
+        {"X", 0, "1"}, {"X", 1, "2"},        {"X", 2, nullptr},
+        {"x", 0, "3"}, {"\xc3\x9c", 0, "4"}, {"\xc3\xbc", 0, nullptr},
+        {"", 1, "y"},  {"", 5, nullptr},
     };
     for (const auto& c : cases) {
         ZEBXmlElement* found = root->GetElement(Z(c.tag), c.index);
+        EXPECT_EQ(root->GetElement(std::string_view(c.tag), c.index), found) << "by UTF-8: " << c.tag << c.index;
         if (!c.text) {
             EXPECT_EQ(found, nullptr) << c.tag << c.index;
             continue;
         }
         ASSERT_NE(found, nullptr) << c.tag << c.index;
         EXPECT_EQ(S(found->GetText()), c.text) << c.tag << c.index;
+        if (*c.tag) {
+            EXPECT_TRUE(found->HasTag(c.tag)) << c.tag;
+        }
     }
-    EXPECT_EQ(root->CountElement(Z("")), 4u);
+    EXPECT_FALSE(root->GetElement(std::string_view("Y"), 0)->HasTag("y"));
+    EXPECT_EQ(root->CountElement(Z("")), 5u);
     EXPECT_EQ(root->CountElement(Z("X")), 2u);
 }
 

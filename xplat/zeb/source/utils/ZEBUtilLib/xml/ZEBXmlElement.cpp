@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <memory>
+#include <optional>
 
 #include "tov/sdk/TOVFailureStyle.h"
 #include "tov/sdk/TOVPtr.h"
@@ -17,6 +18,10 @@ namespace {
 [[noreturn]] void Throw(TOVRESULT result) { throw static_cast<int>(result); }
 
 std::string IndexKey(const ZEBString& name) { return reinterpret_cast<const char*>(name.GetUTF8String()); }
+
+// A tag argument in UTF-8: tags compare exactly, code point by code point, so
+// as UTF-8 bytes. No string at all is the empty tag, which matches any.
+std::string WantedTag(const ZEBString& name) { return name.IsEmpty() ? std::string() : IndexKey(name); }
 
 template <class Pair>
 std::function<bool(ZEBXmlElement&)> MatchedBy(const Pair* pairs, unsigned int count) {
@@ -117,20 +122,24 @@ TOVRESULT ZEBXmlElement::SetTagName(const ZEBString& tag) {
 
 ZEBString ZEBXmlElement::GetText() {
     TOVCheck(Load());
-    std::vector<ZEBXmlText*> pieces;
-    TOVCheck(GetAllTexts(pieces));
-    std::vector<ZEBString> parts;
-    for (const ZEBXmlText* piece : pieces) {
+    // The result is UTF-16 in every case. Each piece comes as a string of its
+    // own, so the first that is not empty becomes the result, converted in
+    // place, and the others are appended to it.
+    std::optional<ZEBString> text;
+    for (ZEBXmlNode* child : m_Children) {
+        const auto* piece = NodeAs<ZEBXmlText>(child);
+        if (!piece) continue;
         ZEBString part = piece->GetText();
-        if (!part.IsEmpty()) parts.push_back(std::move(part));
+        if (part.IsEmpty()) continue;
+        if (text) {
+            *text += part;
+        } else {
+            part.ConvertTo(kTOVUnicodeUTF16);
+            text.emplace(std::move(part));
+        }
     }
-    // The result is UTF-16 in every case; a single piece, the common one, is
-    // converted once instead of appended to an empty text.
-    if (parts.empty()) return EmptyText();
-    if (parts.size() == 1) return ZEBString(kTOVUnicodeUTF16, parts.front().InArg());
-    ZEBString text = EmptyText();
-    for (const ZEBString& part : parts) text += part;
-    return text;
+    if (!text) return EmptyText();
+    return std::move(*text);
 }
 
 TOVRESULT ZEBXmlElement::SetText(const ZEBString& text) {
@@ -294,6 +303,8 @@ int ZEBXmlElement::IsMatched(const _ZEBXMLELEMPAIR* pairs, unsigned int count, i
     return 0;
 }
 
+bool ZEBXmlElement::HasTag(std::string_view tag) { return TagKey() == tag; }
+
 const std::string& ZEBXmlElement::TagKey() {
     if (IsNew() || !m_HasTagKey) {
         m_TagKey = IndexKey(GetTagName());
@@ -302,25 +313,22 @@ const std::string& ZEBXmlElement::TagKey() {
     return m_TagKey;
 }
 
-void ZEBXmlElement::VisitElements(const ZEBString& name, const Filter& filter,
-                                  const std::function<bool(ZEBXmlElement*)>& visit) {
+template <class Visit>
+void ZEBXmlElement::VisitElements(std::string_view tag, const Filter& filter, Visit&& visit) {
     TOVCheck(Load());
-    const bool everyTag = name.IsEmpty() != 0;
-    // Tags compare exactly, code point by code point: as UTF-8 bytes.
-    const std::string wanted = everyTag ? std::string() : IndexKey(name);
     for (size_t i = 0; i < m_Children.size(); ++i) {
         auto* element = NodeAs<ZEBXmlElement>(m_Children[i]);
         if (!element) continue;
-        if (!everyTag && element->TagKey() != wanted) continue;
+        if (!tag.empty() && element->TagKey() != tag) continue;
         if (filter && !filter(*element)) continue;
         if (!visit(element)) return;
     }
 }
 
-ZEBXmlElement* ZEBXmlElement::NthElement(const ZEBString& name, const Filter& filter, unsigned int index) {
+ZEBXmlElement* ZEBXmlElement::NthElement(std::string_view tag, const Filter& filter, unsigned int index) {
     ZEBXmlElement* found = nullptr;
     unsigned int seen = 0;
-    VisitElements(name, filter, [&](ZEBXmlElement* element) {
+    VisitElements(tag, filter, [&](ZEBXmlElement* element) {
         if (seen++ != index) return true;
         found = element;
         return false;
@@ -331,7 +339,7 @@ ZEBXmlElement* ZEBXmlElement::NthElement(const ZEBString& name, const Filter& fi
 TOVRESULT ZEBXmlElement::CollectElements(const ZEBString& name, const Filter& filter,
                                          std::vector<ZEBXmlElement*>& out) {
     return TOVGuarded([&] {
-        VisitElements(name, filter, [&](ZEBXmlElement* element) {
+        VisitElements(WantedTag(name), filter, [&](ZEBXmlElement* element) {
             out.push_back(element);
             return true;
         });
@@ -339,9 +347,9 @@ TOVRESULT ZEBXmlElement::CollectElements(const ZEBString& name, const Filter& fi
     });
 }
 
-unsigned int ZEBXmlElement::CountElements(const ZEBString& name, const Filter& filter) {
+unsigned int ZEBXmlElement::CountElements(std::string_view tag, const Filter& filter) {
     unsigned int count = 0;
-    VisitElements(name, filter, [&](ZEBXmlElement*) {
+    VisitElements(tag, filter, [&](ZEBXmlElement*) {
         ++count;
         return true;
     });
@@ -368,17 +376,21 @@ TOVRESULT ZEBXmlElement::DeleteMatches(const ZEBString& name, const Filter& filt
 }
 
 ZEBXmlElement* ZEBXmlElement::GetElement(const ZEBString& name, unsigned int index) {
-    return NthElement(name, Filter(), index);
+    return NthElement(WantedTag(name), Filter(), index);
+}
+
+ZEBXmlElement* ZEBXmlElement::GetElement(std::string_view tag, unsigned int index) {
+    return NthElement(tag, Filter(), index);
 }
 
 ZEBXmlElement* ZEBXmlElement::GetElement(const ZEBString& name, const _ZEBXMLATTRPAIR* pairs, unsigned int count,
                                          unsigned int index) {
-    return NthElement(name, MatchedBy(pairs, count), index);
+    return NthElement(WantedTag(name), MatchedBy(pairs, count), index);
 }
 
 ZEBXmlElement* ZEBXmlElement::GetElement(const ZEBString& name, const _ZEBXMLELEMPAIR* pairs, unsigned int count,
                                          unsigned int index) {
-    return NthElement(name, MatchedBy(pairs, count), index);
+    return NthElement(WantedTag(name), MatchedBy(pairs, count), index);
 }
 
 TOVRESULT ZEBXmlElement::GetElements(const ZEBString& name, std::vector<ZEBXmlElement*>& out) {
@@ -395,14 +407,14 @@ TOVRESULT ZEBXmlElement::GetElements(const ZEBString& name, const _ZEBXMLELEMPAI
     return CollectElements(name, MatchedBy(pairs, count), out);
 }
 
-unsigned int ZEBXmlElement::CountElement(const ZEBString& name) { return CountElements(name, Filter()); }
+unsigned int ZEBXmlElement::CountElement(const ZEBString& name) { return CountElements(WantedTag(name), Filter()); }
 
 unsigned int ZEBXmlElement::CountElement(const ZEBString& name, const _ZEBXMLATTRPAIR* pairs, unsigned int count) {
-    return CountElements(name, MatchedBy(pairs, count));
+    return CountElements(WantedTag(name), MatchedBy(pairs, count));
 }
 
 unsigned int ZEBXmlElement::CountElement(const ZEBString& name, const _ZEBXMLELEMPAIR* pairs, unsigned int count) {
-    return CountElements(name, MatchedBy(pairs, count));
+    return CountElements(WantedTag(name), MatchedBy(pairs, count));
 }
 
 TOVRESULT ZEBXmlElement::DeleteElements(const ZEBString& name, unsigned int&) {

@@ -12,6 +12,7 @@
 #include <functional>
 #include <map>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "xml/ZEBXmlNode.h"
@@ -51,6 +52,8 @@ public:
     TOVRESULT Save(UTIL::ITOVXmlWriter* writer) override;
 
     ZEBString GetTagName();
+    /// Whether the tag is `tag`, given in UTF-8.
+    bool HasTag(std::string_view tag);
     /// For an element made in memory only; TOV_E_UNEXPECTED otherwise.
     TOVRESULT SetTagName(const ZEBString& tag);
 
@@ -93,6 +96,8 @@ public:
 
     /// The index-th matching child element, counted from 0, or null.
     ZEBXmlElement* GetElement(const ZEBString& name, unsigned int index);
+    /// The same with the tag in UTF-8, for fixed names that need no host string.
+    ZEBXmlElement* GetElement(std::string_view tag, unsigned int index);
     ZEBXmlElement* GetElement(const ZEBString& name, const _ZEBXMLATTRPAIR* pairs, unsigned int count,
                               unsigned int index);
     ZEBXmlElement* GetElement(const ZEBString& name, const _ZEBXMLELEMPAIR* pairs, unsigned int count,
@@ -130,13 +135,13 @@ private:
     /// fetched once per DOM node.
     const std::string& TagKey();
 
-    /// Loads, then calls `visit` for each child element whose tag matches
-    /// `name` and that passes `filter`, until `visit` returns false.
-    void VisitElements(const ZEBString& name, const Filter& filter,
-                       const std::function<bool(ZEBXmlElement*)>& visit);
-    ZEBXmlElement* NthElement(const ZEBString& name, const Filter& filter, unsigned int index);
+    /// Loads, then calls `visit` for each child element whose tag is `tag`
+    /// (UTF-8, empty for any) and that passes `filter`, until `visit` returns false.
+    template <class Visit>
+    void VisitElements(std::string_view tag, const Filter& filter, Visit&& visit);
+    ZEBXmlElement* NthElement(std::string_view tag, const Filter& filter, unsigned int index);
     TOVRESULT CollectElements(const ZEBString& name, const Filter& filter, std::vector<ZEBXmlElement*>& out);
-    unsigned int CountElements(const ZEBString& name, const Filter& filter);
+    unsigned int CountElements(std::string_view tag, const Filter& filter);
     /// Deletes the matches; the count of matches when `deleted` is not null.
     TOVRESULT DeleteMatches(const ZEBString& name, const Filter& filter, unsigned int* deleted);
     /// A new element of tag `name`, with `text` when it is not null, appended.

@@ -57,6 +57,7 @@ TOVRESULT ZEBXmlNode::Load() {
             }
         }
         const uint32_t count = m_pDom->GetChildCount();
+        m_Children.reserve(m_Children.size() + count);
         for (uint32_t i = 0; i < count; ++i) {
             TOVPtr<UTIL::ITOVXmlDomNode> child;
             TOVCheck(m_pDom->GetChild(i, child.OutT()));
