@@ -39,7 +39,7 @@ bool DropFrameFromString(const ZEB::ZEBString& text, bool& drop) {
     return false;
 }
 
-bool FrameRateFromString(ZEB::ZEBString text, _aafRational_t& rate) {
+bool FrameRateFromString(const ZEB::ZEBString& text, _aafRational_t& rate) {
     try {
         const std::vector<std::string> parts = HelperFunctions::SplitString(UTF8Text(text), '/');
         if (parts.size() != 2 || parts[0].empty() || parts[1].empty()) return false;
@@ -56,7 +56,7 @@ bool FrameRateFromString(ZEB::ZEBString text, _aafRational_t& rate) {
     }
 }
 
-bool SamplesFromString(ZEB::ZEBString hi, ZEB::ZEBString lo, unsigned long long& samples) {
+bool SamplesFromString(const ZEB::ZEBString& hi, const ZEB::ZEBString& lo, unsigned long long& samples) {
     uint32_t high = 0;
     uint32_t low = 0;
     if (!IntegerFromZEBString(hi, high) || !IntegerFromZEBString(lo, low)) return false;

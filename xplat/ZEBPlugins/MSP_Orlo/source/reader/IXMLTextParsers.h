@@ -16,9 +16,9 @@ bool BoolFromString(const ZEB::ZEBString& text, bool& value);
 /// "DF" is drop frame, "NDF" is not.
 bool DropFrameFromString(const ZEB::ZEBString& text, bool& drop);
 /// "numerator/denominator", both present and read as signed integers.
-bool FrameRateFromString(ZEB::ZEBString text, _aafRational_t& rate);
+bool FrameRateFromString(const ZEB::ZEBString& text, _aafRational_t& rate);
 /// hi × 2^32 + lo, each read as an unsigned 32-bit integer; neither may be empty.
-bool SamplesFromString(ZEB::ZEBString hi, ZEB::ZEBString lo, unsigned long long& samples);
+bool SamplesFromString(const ZEB::ZEBString& hi, const ZEB::ZEBString& lo, unsigned long long& samples);
 /// Cuts `text` after its last ">".
 void TruncateIXMLString(std::string& text);
 
@@ -27,7 +27,7 @@ std::string UTF8Text(const ZEB::ZEBString& text);
 
 /// A non-empty text read as T (unsigned 16- or 32-bit).
 template <typename T>
-bool IntegerFromZEBString(ZEB::ZEBString text, T& value) {
+bool IntegerFromZEBString(const ZEB::ZEBString& text, T& value) {
     if (text.IsEmpty()) return false;
     std::istringstream stream(UTF8Text(text));
     T read{};
