@@ -22,32 +22,33 @@ namespace {
 
 using Json = nlohmann::ordered_json;
 
+// Says on stderr what was not done, and passes the result on.
+TOVRESULT Refused(TOVRESULT result, const std::string& what) {
+    if (result < 0) std::fprintf(stderr, "orlo: %s (%s)\n", what.c_str(), ResultText(result).c_str());
+    return result;
+}
+
 // The toggles through the plug-in's own setter, the setting through the
 // host's settings object, as a user's choices in the host would stand.
 // The texts were checked when the command line was read.
 TOVRESULT ApplyChoices(TOVHost& host, const std::vector<std::string>& toggleTexts, bool noAutodetectGroups) {
-    return TOVGuarded([&] {
-        TOVPtr<ITOVComponentFactory> factory;
-        factory.Assign(&host);
-        for (const std::string& text : toggleTexts) {
-            ToggleSetting toggle;
-            ToggleSetting::Parse(text, toggle);
-            const TOVRESULT result = ZEB::Impl::SetDynamicToggleValue(factory, toggle.path, toggle.value);
-            if (result < 0) {
-                std::fprintf(stderr, "orlo: the toggle %s was not set (%s)\n", toggle.path.c_str(),
-                             ResultText(result).c_str());
-                return result;
-            }
-        }
-        // Without the option the host has no value for the setting, so the
-        // plug-in's default stands.
-        if (noAutodetectGroups) {
-            TOVPtr<IHostSettings> settings;
-            TOVCheck(host.CreateComponent(CompID_HostSettings, nullptr, IID_IHostSettings, settings.Out()));
-            TOVCheck(settings->SetSetting(ZEBHostSetting_AutodetectMonophonicBroadcastWaveGroups, 32, 0));
-        }
-        return TOV_OK;
-    });
+    TOVPtr<ITOVComponentFactory> factory;
+    factory.Assign(&host);
+    for (const std::string& text : toggleTexts) {
+        ToggleSetting toggle;
+        ToggleSetting::Parse(text, toggle);
+        const TOVRESULT result = ZEB::Impl::SetDynamicToggleValue(factory, toggle.path, toggle.value);
+        if (Refused(result, "the toggle " + toggle.path + " was not set") < 0) return result;
+    }
+    // Without the option the host has no value for the setting, so the
+    // plug-in's default stands.
+    if (!noAutodetectGroups) return TOV_OK;
+    return Refused(TOVGuarded([&] {
+                       TOVPtr<IHostSettings> settings;
+                       TOVCheck(host.CreateComponent(CompID_HostSettings, nullptr, IID_IHostSettings, settings.Out()));
+                       return settings->SetSetting(ZEBHostSetting_AutodetectMonophonicBroadcastWaveGroups, 32, 0);
+                   }),
+                   "the host's grouping setting was not stored");
 }
 
 // The grouping decision the plug-in takes from the host before it reads the file.
@@ -94,14 +95,10 @@ int ProbeCommand::Run(const OrloOptions& options) {
 
     // "result" is filled in below; it stands second so that it is seen first.
     Json report = {{"file", m_Path}, {"result", nullptr}};
-    TOVRESULT result;
+    TOVRESULT result = TOV_OK;
     {
         PluginStartup plugin(host);
-        result = plugin.Result();
-        if (result < 0) {
-            std::fprintf(stderr, "orlo: the plug-in did not start (%s)\n", ResultText(result).c_str());
-            return kExitFailed;
-        }
+        if (Refused(plugin.Result(), "the plug-in did not start") < 0) return kExitFailed;
         if (ApplyChoices(host, m_ToggleTexts, m_NoAutodetectGroups) < 0) return kExitFailed;
         report["groupingAllowed"] = GroupingAllowed(host);
         result = MakeMovie(host, m_Path, report);
