@@ -94,6 +94,17 @@ TEST_F(IXMLTextParsers, IntegersOfEachWidth) {
     uint32_t large = 0;
     EXPECT_TRUE(IntegerFromZEBString(Z("48000"), large));
     EXPECT_EQ(large, 48000u);
+    EXPECT_FALSE(IntegerFromZEBString(Z("lots"), large));
+    EXPECT_TRUE(IntegerFromZEBString(Z(" 7"), large)) << "a failed read does not stop the next";
+    EXPECT_EQ(large, 7u);
+}
+
+TEST_F(IXMLTextParsers, VersionsAreDecimalNumbers) {
+    double version = 0;
+    EXPECT_TRUE(VersionFromString(Z("2.10"), version));
+    EXPECT_DOUBLE_EQ(version, 2.1);
+    EXPECT_FALSE(VersionFromString(Z("v2"), version));
+    EXPECT_DOUBLE_EQ(version, 2.1);
 }
 
 TEST(IXMLTextHelpers, TruncateAndSplit) {

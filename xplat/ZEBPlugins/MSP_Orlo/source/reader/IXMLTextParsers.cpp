@@ -1,12 +1,45 @@
 #include "reader/IXMLTextParsers.h"
 
-#include <cstdint>
+#include <locale>
+#include <sstream>
 
 #include "reader/IXMLElements.h"
 #include "reader/SplitString.h"
 
 namespace Chunks {
 namespace IXML {
+
+namespace {
+
+// Setting up a stream costs far more than reading a number with it, so each
+// thread reads its numbers through one stream, reset for every text. It reads
+// in the classic locale, which is what a new stream got here: nothing sets
+// another global one.
+std::istream& StreamOver(const std::string& text) {
+    thread_local std::istringstream stream = [] {
+        std::istringstream made;
+        made.imbue(std::locale::classic());
+        return made;
+    }();
+    stream.clear();
+    stream.str(text);
+    return stream;
+}
+
+template <typename T>
+bool ReadNumber(const std::string& text, T& value) {
+    T read{};
+    if (!(StreamOver(text) >> read)) return false;
+    value = read;
+    return true;
+}
+
+template <typename T>
+bool IntegerFrom(const ZEB::ZEBString& text, T& value) {
+    return !text.IsEmpty() && ReadNumber(UTF8Text(text), value);
+}
+
+}  // namespace
 
 std::string UTF8Text(const ZEB::ZEBString& text) {
     if (text.IsEmpty()) return std::string();
@@ -43,11 +76,9 @@ bool FrameRateFromString(const ZEB::ZEBString& text, _aafRational_t& rate) {
     try {
         const std::vector<std::string> parts = HelperFunctions::SplitString(UTF8Text(text), '/');
         if (parts.size() != 2 || parts[0].empty() || parts[1].empty()) return false;
-        std::istringstream numerator(parts[0]);
-        std::istringstream denominator(parts[1]);
         int32_t n = 0;
         int32_t d = 0;
-        if (!(numerator >> n) || !(denominator >> d)) return false;
+        if (!ReadNumber(parts[0], n) || !ReadNumber(parts[1], d)) return false;
         rate.numerator = n;
         rate.denominator = d;
         return true;
@@ -63,6 +94,12 @@ bool SamplesFromString(const ZEB::ZEBString& hi, const ZEB::ZEBString& lo, unsig
     samples = (static_cast<unsigned long long>(high) << 32) + low;
     return true;
 }
+
+bool VersionFromString(const ZEB::ZEBString& text, double& version) { return ReadNumber(UTF8Text(text), version); }
+
+bool IntegerFromZEBString(const ZEB::ZEBString& text, uint16_t& value) { return IntegerFrom(text, value); }
+
+bool IntegerFromZEBString(const ZEB::ZEBString& text, uint32_t& value) { return IntegerFrom(text, value); }
 
 void TruncateIXMLString(std::string& text) {
     const size_t last = text.rfind('>');

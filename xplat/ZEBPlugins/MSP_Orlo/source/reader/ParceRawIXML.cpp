@@ -1,7 +1,6 @@
 #include "reader/ParceRawIXML.h"
 
 #include <optional>
-#include <sstream>
 #include <string_view>
 #include <vector>
 
@@ -51,12 +50,9 @@ void ReadBool(ZEBXmlElement* root, const char* name, IXMLData& data, void (IXMLD
 }
 
 void ReadVersion(ZEBXmlElement* root, IXMLData& data) {
+    const std::optional<ZEBString> text = NonEmptyText(root, E::IXML_VERSION);
     double version = 0;
-    bool has = false;
-    if (const std::optional<ZEBString> text = NonEmptyText(root, E::IXML_VERSION)) {
-        std::istringstream stream(UTF8Text(*text));
-        has = static_cast<bool>(stream >> version);
-    }
+    const bool has = text && VersionFromString(*text, version);
     if (has) data.SetVersion(version);
     data.SetHasVersion(has);
 }
