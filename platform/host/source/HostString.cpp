@@ -72,6 +72,20 @@ std::vector<unsigned char> TerminatedBytes(Units units) {
     return std::vector<unsigned char>(first, first + units.size() * sizeof units[0]);
 }
 
+// Units that valid UTF-8 takes in encoding `type`, counted on its bytes: each
+// byte that does not continue a sequence starts a code point, and each lead of
+// a four-byte sequence starts one that UTF-16 writes as a pair.
+size_t UnitsOf(const std::string& utf8, _tovUnicodeType type) {
+    if (type == kTOVUnicodeUTF8) return utf8.size();
+    size_t units = 0;
+    for (const char c : utf8) {
+        const auto byte = static_cast<unsigned char>(c);
+        if ((byte & 0xC0) != 0x80) ++units;
+        if (type == kTOVUnicodeUTF16 && byte >= 0xF0) ++units;
+    }
+    return units;
+}
+
 // Keeps the address a caller was given while the contents stay the same.
 template <class Buffer>
 void Refresh(Buffer& cache, Buffer fresh) {
@@ -122,20 +136,34 @@ TOVRESULT HostString::InternalQueryInterface(const _tovUID& iid, void** out) {
 // ---- Changing the text
 
 TOVRESULT HostString::Assign(_tovUnicodeType type, ITOVString* source) {
-    return TOVGuarded([&] { return AssignText(type, TextOf(source)); });
+    return TOVGuarded([&] {
+        // Text still kept as it came in as UTF-8 is copied in that form.
+        if (auto* same = dynamic_cast<HostString*>(source); same && same->m_WidePending) {
+            const std::string& utf8 = same->m_UTF8;
+            return Assign(type, reinterpret_cast<const unsigned char*>(utf8.data()),
+                          static_cast<unsigned int>(utf8.size()));
+        }
+        return AssignText(type, TextOf(source));
+    });
 }
 
 TOVRESULT HostString::Assign(_tovUnicodeType type, const unsigned char* text, unsigned int n) {
     return TOVGuarded([&] {
-        const TOVRESULT result = AssignText(type, ReadText(text, n));
+        // An external buffer takes the text in its encoding at once.
+        if (m_External) return AssignText(type, ReadText(text, n));
+        if (!text && n > 1) return TOV_E_INVALIDARG;
+        const size_t length = text ? LengthWithin(text, n) : 0;
+        if (!UnicodeCodec::IsValidUTF8(text, length) || !IsKnownType(type)) return TOV_E_INVALIDARG;
         // Valid UTF-8 is the one encoding of its code points, so the input is
-        // the UTF-8 view as it stands: large texts handed in and read back as
-        // UTF-8 (XML documents) are not encoded again.
-        if (result >= 0 && text) {
-            m_UTF8.assign(reinterpret_cast<const char*>(text), m_Text.empty() ? 0 : LengthWithin(text, n));
-            m_UTF8Fresh = true;
-        }
-        return result;
+        // kept as it came, as the UTF-8 view, and decoded only when something
+        // needs the code points: texts handed in as UTF-8 (names, values,
+        // whole XML documents) are mostly read back as UTF-8.
+        m_UTF8.assign(text ? reinterpret_cast<const char*>(text) : "", length);
+        m_Text.clear();
+        m_WidePending = true;
+        Changed(type);
+        m_UTF8Fresh = true;
+        return TOV_OK;
     });
 }
 
@@ -231,7 +259,7 @@ TOVRESULT HostString::Clear() {
 
 TOVRESULT HostString::Truncate(unsigned int count) {
     return TOVGuarded([&] {
-        if (count < m_Text.size()) Commit(CodePoints().substr(0, count), m_Type);
+        if (count < Text().size()) Commit(CodePoints().substr(0, count), m_Type);
         return TOV_OK;
     });
 }
@@ -244,9 +272,23 @@ void HostString::Commit(std::wstring text, _tovUnicodeType type) {
         std::memcpy(m_External, bytes.data(), bytes.size());
     }
     m_Text.swap(text);
+    m_WidePending = false;
+    Changed(type);
+}
+
+void HostString::Changed(_tovUnicodeType type) {
     m_Type = type;
     m_UTF8Fresh = m_UTF16Fresh = m_UTF32Fresh = false;
     m_WideHandedOut = false;  // the storage handed out is no longer valid
+}
+
+const std::wstring& HostString::Text() {
+    if (m_WidePending) {
+        // The bytes were checked when they came in, so they decode.
+        UnicodeCodec::DecodeUTF8(reinterpret_cast<const unsigned char*>(m_UTF8.data()), m_UTF8.size(), m_Text);
+        m_WidePending = false;
+    }
+    return m_Text;
 }
 
 // ---- Views and counts
@@ -254,7 +296,7 @@ void HostString::Commit(std::wstring text, _tovUnicodeType type) {
 TOVRESULT HostString::GetUTF8String(const unsigned char** out) {
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
-        if (!m_UTF8Fresh || m_WideHandedOut) Refresh(m_UTF8, UnicodeCodec::EncodeUTF8(std::wstring_view(m_Text)));
+        if (!m_UTF8Fresh || m_WideHandedOut) Refresh(m_UTF8, UnicodeCodec::EncodeUTF8(std::wstring_view(Text())));
         m_UTF8Fresh = true;
         *out = reinterpret_cast<const unsigned char*>(m_UTF8.c_str());
         return TOV_OK;
@@ -265,7 +307,7 @@ TOVRESULT HostString::GetUTF16String(const unsigned short** out) {
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
         if (!m_UTF16Fresh || m_WideHandedOut) {
-            std::vector<unsigned short> units = UnicodeCodec::EncodeUTF16(std::wstring_view(m_Text));
+            std::vector<unsigned short> units = UnicodeCodec::EncodeUTF16(std::wstring_view(Text()));
             units.push_back(0);
             Refresh(m_UTF16, std::move(units));
         }
@@ -279,7 +321,7 @@ TOVRESULT HostString::GetUTF32String(const unsigned int** out) {
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
         if (!m_UTF32Fresh || m_WideHandedOut) {
-            std::vector<unsigned int> units = UnicodeCodec::EncodeUTF32(std::wstring_view(m_Text));
+            std::vector<unsigned int> units = UnicodeCodec::EncodeUTF32(std::wstring_view(Text()));
             units.push_back(0);
             Refresh(m_UTF32, std::move(units));
         }
@@ -290,13 +332,17 @@ TOVRESULT HostString::GetUTF32String(const unsigned int** out) {
 }
 
 TOVRESULT HostString::GetWCHARString(wchar_t** out) {
-    if (!out) return TOV_E_INVALIDARG;
-    m_WideHandedOut = true;
-    *out = m_Text.data();
-    return TOV_OK;
+    return TOVGuarded([&] {
+        if (!out) return TOV_E_INVALIDARG;
+        Text();
+        m_WideHandedOut = true;
+        *out = m_Text.data();
+        return TOV_OK;
+    });
 }
 
 uint32_t HostString::GetCodePointCount() {
+    if (m_WidePending) return static_cast<uint32_t>(UnitsOf(m_UTF8, m_Type));
     if (m_Type != kTOVUnicodeUTF8 && m_Type != kTOVUnicodeUTF16) return static_cast<uint32_t>(m_Text.size());
     size_t units = 0;
     for (wchar_t wc : m_Text) {
@@ -311,10 +357,14 @@ uint32_t HostString::GetByteCount() {
     return GetCodePointCount() * unitSize;
 }
 
-uint32_t HostString::GetNumCharacters() { return static_cast<uint32_t>(m_Text.size()); }
+uint32_t HostString::GetNumCharacters() {
+    return static_cast<uint32_t>(m_WidePending ? UnitsOf(m_UTF8, kTOVUnicodeUTF32) : m_Text.size());
+}
 
-std::wstring HostString::CodePoints() const {
-    std::wstring text(m_Text);
+int HostString::IsEmpty() { return (m_WidePending ? m_UTF8.empty() : m_Text.empty()) ? 1 : 0; }
+
+std::wstring HostString::CodePoints() {
+    std::wstring text(Text());
     for (wchar_t& wc : text) {
         if (!UnicodeCodec::IsScalarValue(static_cast<uint32_t>(wc)))
             wc = static_cast<wchar_t>(UnicodeCodec::kReplacement);
@@ -356,7 +406,7 @@ TOVRESULT HostString::Compare(const wchar_t* text, unsigned int n, int* result, 
     return TOVGuarded([&] { return CompareText(ReadText(text, n), result, caseSensitive); });
 }
 
-TOVRESULT HostString::CompareText(const std::wstring& other, int* result, int caseSensitive) const {
+TOVRESULT HostString::CompareText(const std::wstring& other, int* result, int caseSensitive) {
     if (!result) return TOV_E_INVALIDARG;
     const int order = caseSensitive ? CodePoints().compare(other) : Folded(CodePoints()).compare(Folded(other));
     *result = order < 0 ? -1 : order > 0 ? 1 : 0;
@@ -403,14 +453,14 @@ TOVRESULT HostString::FindStringReverse(const wchar_t* text, unsigned int n, int
     return TOVGuarded([&] { return FindTextReverse(ReadText(text, n), start, position); });
 }
 
-TOVRESULT HostString::FindText(const std::wstring& needle, int start, int* position) const {
+TOVRESULT HostString::FindText(const std::wstring& needle, int start, int* position) {
     if (!position) return TOV_E_INVALIDARG;
     const size_t found = CodePoints().find(needle, start < 0 ? 0 : static_cast<size_t>(start));
     *position = found == std::wstring::npos ? -1 : static_cast<int>(found);
     return TOV_OK;
 }
 
-TOVRESULT HostString::FindTextReverse(const std::wstring& needle, int start, int* position) const {
+TOVRESULT HostString::FindTextReverse(const std::wstring& needle, int start, int* position) {
     if (!position) return TOV_E_INVALIDARG;
     // A start at or past the end already searches from the end.
     const size_t found = CodePoints().rfind(needle, start < 0 ? std::wstring::npos : static_cast<size_t>(start));
@@ -455,7 +505,7 @@ TOVRESULT HostString::SetCharacter(unsigned int index, unsigned int codePoint) {
 }
 
 TOVRESULT HostString::SetCharacterText(unsigned int index, const std::wstring& character) {
-    if (index >= m_Text.size()) return TOV_E_OUTOFRANGE;
+    if (index >= Text().size()) return TOV_E_OUTOFRANGE;
     if (character.size() != 1) return TOV_E_INVALIDARG;
     std::wstring text = CodePoints();
     text[index] = character[0];
@@ -463,8 +513,8 @@ TOVRESULT HostString::SetCharacterText(unsigned int index, const std::wstring& c
     return TOV_OK;
 }
 
-wchar_t HostString::CharacterAt(unsigned int index) const {
-    if (index >= m_Text.size()) Fail(TOV_E_OUTOFRANGE);
+wchar_t HostString::CharacterAt(unsigned int index) {
+    if (index >= Text().size()) Fail(TOV_E_OUTOFRANGE);
     const wchar_t value = m_Text[index];
     return UnicodeCodec::IsScalarValue(static_cast<uint32_t>(value)) ? value
                                                                      : static_cast<wchar_t>(UnicodeCodec::kReplacement);

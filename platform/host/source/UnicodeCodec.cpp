@@ -6,6 +6,35 @@ namespace {
 
 bool IsContinuation(unsigned char byte) { return (byte & 0xC0) == 0x80; }
 
+// The length of the well-formed UTF-8 sequence at `text[i]`, whose code point
+// goes to `cp`; 0 for a malformed one.
+inline size_t UTF8Sequence(const unsigned char* text, size_t n, size_t i, uint32_t& cp) {
+    const unsigned char lead = text[i];
+    if (lead < 0x80) {
+        cp = lead;
+        return 1;
+    }
+    size_t length;
+    uint32_t minimum;
+    if (lead >= 0xC2 && lead <= 0xDF) {
+        length = 2, cp = lead & 0x1F, minimum = 0x80;
+    } else if (lead >= 0xE0 && lead <= 0xEF) {
+        length = 3, cp = lead & 0x0F, minimum = 0x800;
+    } else if (lead >= 0xF0 && lead <= 0xF4) {
+        length = 4, cp = lead & 0x07, minimum = 0x10000;
+    } else {
+        return 0;  // a stray continuation byte, 0xC0, 0xC1 or 0xF5 and above
+    }
+    if (n - i < length) return 0;
+    for (size_t k = 1; k < length; ++k) {
+        if (!IsContinuation(text[i + k])) return 0;
+        cp = (cp << 6) | (text[i + k] & 0x3F);
+    }
+    // Overlong forms, encoded surrogates and values past 0x10FFFF.
+    if (cp < minimum || !UnicodeCodec::IsScalarValue(cp)) return 0;
+    return length;
+}
+
 char32_t Scalar(uint32_t value) {
     return UnicodeCodec::IsScalarValue(value) ? static_cast<char32_t>(value) : UnicodeCodec::kReplacement;
 }
@@ -76,40 +105,25 @@ bool DecodeUTF32Of(const Unit* text, size_t n, Text& out) {
 
 bool UnicodeCodec::IsScalarValue(uint32_t value) { return value <= 0x10FFFF && (value < 0xD800 || value > 0xDFFF); }
 
+bool UnicodeCodec::IsValidUTF8(const unsigned char* text, size_t n) {
+    uint32_t cp;
+    for (size_t i = 0, length; i < n; i += length) {
+        length = UTF8Sequence(text, n, i, cp);
+        if (length == 0) return false;
+    }
+    return true;
+}
+
 template <class Text>
 bool UnicodeCodec::DecodeUTF8(const unsigned char* text, size_t n, Text& out) {
     using CodePoint = typename Text::value_type;
     Text decoded(n, 0);
     CodePoint* next = decoded.data();
-    size_t i = 0;
-    while (i < n) {
-        const unsigned char lead = text[i];
-        size_t length;
-        uint32_t cp;
-        uint32_t minimum;
-        if (lead < 0x80) {
-            *next++ = static_cast<CodePoint>(lead);
-            ++i;
-            continue;
-        }
-        if (lead >= 0xC2 && lead <= 0xDF) {
-            length = 2, cp = lead & 0x1F, minimum = 0x80;
-        } else if (lead >= 0xE0 && lead <= 0xEF) {
-            length = 3, cp = lead & 0x0F, minimum = 0x800;
-        } else if (lead >= 0xF0 && lead <= 0xF4) {
-            length = 4, cp = lead & 0x07, minimum = 0x10000;
-        } else {
-            return false;  // a stray continuation byte, 0xC0, 0xC1 or 0xF5 and above
-        }
-        if (n - i < length) return false;
-        for (size_t k = 1; k < length; ++k) {
-            if (!IsContinuation(text[i + k])) return false;
-            cp = (cp << 6) | (text[i + k] & 0x3F);
-        }
-        // Overlong forms, encoded surrogates and values past 0x10FFFF.
-        if (cp < minimum || !IsScalarValue(cp)) return false;
+    uint32_t cp;
+    for (size_t i = 0, length; i < n; i += length) {
+        length = UTF8Sequence(text, n, i, cp);
+        if (length == 0) return false;
         *next++ = static_cast<CodePoint>(cp);
-        i += length;
     }
     decoded.resize(static_cast<size_t>(next - decoded.data()));
     out = std::move(decoded);

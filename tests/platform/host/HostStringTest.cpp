@@ -121,6 +121,10 @@ TEST_F(HostStringTest, ConvertsBetweenEveryEncodingAndForm) {
             SCOPED_TRACE(testing::Message() << "form " << form << ", stored " << stored);
             TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, U"old");
             ASSERT_EQ(InForm(form, kMixed, [&](auto p, unsigned int n) { return s->Assign(stored, p, n); }), TOV_OK);
+            // Counted before anything reads the text back (UTF-8 input is kept as it came).
+            EXPECT_EQ(s->GetCodePointCount(), counts[stored - 1].units);
+            EXPECT_EQ(s->GetByteCount(), counts[stored - 1].bytes);
+            EXPECT_EQ(s->GetNumCharacters(), 4u);
             for (_tovUnicodeType target : kTypes) {
                 ASSERT_EQ(s->ConvertTo(target), TOV_OK);
                 EXPECT_EQ(s->GetUnicodeType(), target);
@@ -410,12 +414,14 @@ TEST_F(HostStringTest, AppendsAndAssignsInTheStoredEncoding) {
     EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF16);
     EXPECT_EQ(s->GetCodePointCount(), 10u);
 
-    TOVPtr<ITOVString> other = NewString(kTOVUnicodeUTF8, U"ü");
+    TOVPtr<ITOVString> other = NewString(kTOVUnicodeUTF8, U"");
+    ASSERT_EQ(other->Assign(kTOVUnicodeUTF8, Bytes(u8"ü"), 2), TOV_OK);  // kept as UTF-8, and copied so
     ASSERT_EQ(s->Assign(kTOVUnicodeUTF32, other.Get()), TOV_OK);
-    EXPECT_EQ(WideOf(s.Get()), U"ü");
     EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF32);
     ASSERT_EQ(s->Assign(kTOVUnicodeUTF8, s.Get()), TOV_OK);
     EXPECT_EQ(s->GetByteCount(), 2u);
+    EXPECT_EQ(WideOf(s.Get()), U"ü");
+    EXPECT_EQ(WideOf(other.Get()), U"ü");
 
     ASSERT_EQ(s->Clear(), TOV_OK);
     EXPECT_EQ(s->IsEmpty(), 1);
@@ -424,7 +430,8 @@ TEST_F(HostStringTest, AppendsAndAssignsInTheStoredEncoding) {
 }
 
 TEST_F(HostStringTest, ConvertedCopyIsAnIndependentString) {
-    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, kMixed);
+    TOVPtr<ITOVString> s = NewString(kTOVUnicodeUTF8, U"");
+    ASSERT_EQ(s->Assign(kTOVUnicodeUTF8, Bytes(kMixedUTF8), sizeof kMixedUTF8), TOV_OK);
     TOVPtr<ITOVString> copy;
     ASSERT_EQ(s->ConvertedCopy(kTOVUnicodeUTF16, copy.OutT()), TOV_OK);
     EXPECT_NE(copy.Get(), s.Get());

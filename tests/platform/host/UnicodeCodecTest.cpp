@@ -41,6 +41,7 @@ TEST(UnicodeCodecTest, EncodesAndDecodesEveryFormBothWays) {
         EXPECT_EQ(UnicodeCodec::EncodeUTF32(c.codePoints),
                   std::vector<unsigned int>(c.codePoints.begin(), c.codePoints.end()));
 
+        EXPECT_TRUE(UnicodeCodec::IsValidUTF8(c.utf8.data(), c.utf8.size()));
         std::u32string decoded;
         ASSERT_TRUE(UnicodeCodec::DecodeUTF8(c.utf8.data(), c.utf8.size(), decoded));
         EXPECT_EQ(decoded, c.codePoints);
@@ -84,6 +85,7 @@ TEST(UnicodeCodecTest, RefusesMalformedUTF8AndKeepsTheOutput) {
     };
     for (const auto& bytes : malformed) {
         SCOPED_TRACE(testing::PrintToString(bytes));
+        EXPECT_FALSE(UnicodeCodec::IsValidUTF8(bytes.data(), bytes.size()));
         std::u32string out = U"kept";
         EXPECT_FALSE(UnicodeCodec::DecodeUTF8(bytes.data(), bytes.size(), out));
         EXPECT_EQ(out, U"kept");

@@ -5,6 +5,8 @@
 /// - The text is held as code points; the stored encoding is what
 ///   GetUnicodeType reports, what the counts measure and the form an external
 ///   buffer is kept in. A new string is empty and wide (kTOVUnicodeWCHAR).
+/// - Text handed in as UTF-8 is kept as it came, as the UTF-8 view, and
+///   decoded into code points only when something needs them.
 /// - Input text ends at its first zero unit within `n`; what follows is not
 ///   read. A null pointer with `n` 0 or 1 is the empty text, with a larger `n`
 ///   TOV_E_INVALIDARG. So the text never holds U+0000 through the interface,
@@ -100,25 +102,30 @@ public:
     TOVRESULT RemoveExternalBuffer(unsigned char** buffer) override;
 
     _tovUnicodeType GetUnicodeType() override { return m_Type; }
-    int IsEmpty() override { return m_Text.empty() ? 1 : 0; }
+    int IsEmpty() override;
     TOVRESULT Clear() override;
 
     TOVRESULT InternalQueryInterface(const _tovUID& iid, void** out) override;
 
 private:
+    /// The code points, decoded first when the text is kept as UTF-8 only.
+    const std::wstring& Text();
     /// The text with every non-scalar value replaced by U+FFFD.
-    std::wstring CodePoints() const;
+    std::wstring CodePoints();
     /// Makes `text` the string's text in encoding `type`, or throws
     /// TOV_E_OUTOFRANGE when an external buffer cannot hold it; all or nothing.
     void Commit(std::wstring text, _tovUnicodeType type);
+    /// The stored encoding is `type`, the views are stale, and the wide storage
+    /// handed out is no longer the text.
+    void Changed(_tovUnicodeType type);
     TOVRESULT AssignText(_tovUnicodeType type, std::wstring text);
     TOVRESULT AppendText(const std::wstring& text);
-    TOVRESULT CompareText(const std::wstring& other, int* result, int caseSensitive) const;
-    TOVRESULT FindText(const std::wstring& needle, int start, int* position) const;
-    TOVRESULT FindTextReverse(const std::wstring& needle, int start, int* position) const;
+    TOVRESULT CompareText(const std::wstring& other, int* result, int caseSensitive);
+    TOVRESULT FindText(const std::wstring& needle, int start, int* position);
+    TOVRESULT FindTextReverse(const std::wstring& needle, int start, int* position);
     TOVRESULT SetCharacterText(unsigned int index, const std::wstring& character);
     /// The character at `index`, or throws TOV_E_OUTOFRANGE.
-    wchar_t CharacterAt(unsigned int index) const;
+    wchar_t CharacterAt(unsigned int index);
 
     /// The text of another string, which may be this one.
     static std::wstring TextOf(ITOVString* source);
@@ -126,7 +133,9 @@ private:
     /// `text` in encoding `type`, terminator included, as raw native-order bytes.
     static std::vector<unsigned char> EncodeBytes(const std::wstring& text, _tovUnicodeType type);
 
+    /// The code points; while `m_WidePending`, not yet decoded from `m_UTF8`.
     std::wstring m_Text;
+    bool m_WidePending = false;
     _tovUnicodeType m_Type = kTOVUnicodeWCHAR;
     std::string m_UTF8;
     std::vector<unsigned short> m_UTF16;

@@ -21,6 +21,8 @@ public:
     /// Whether `value` is at most 0x10FFFF and not a surrogate.
     static bool IsScalarValue(uint32_t value);
 
+    /// Whether the `n` bytes at `text` are well-formed UTF-8, by the rules the decoder keeps.
+    static bool IsValidUTF8(const unsigned char* text, size_t n);
     /// Replace `out` by the code points of the `n` units at `text`. `Text` is
     /// std::u32string or std::wstring: wchar_t is 32 bits here and holds
     /// UTF-32, so both hold code points.
