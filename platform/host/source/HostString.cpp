@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cstring>
 
+#include "tov/host/CreateKnownComponent.h"
 #include "tov/host/UTF8Locale.h"
 #include "tov/host/UnicodeCodec.h"
 #include "tov/sdk/TOVComponent.h"
@@ -218,7 +219,7 @@ TOVRESULT HostString::ConvertedCopy(_tovUnicodeType type, ITOVString** out) {
         *out = nullptr;
         if (!IsKnownType(type)) return TOV_E_INVALIDARG;
         TOVPtr<ITOVString> copy;
-        TOVCheck(TOVCreate(nullptr, nullptr, IID_ITOVString, copy.Out()));
+        TOVCheck((CreateKnownComponent<ITOVString, HostString>(copy.OutT())));
         TOVCheck(copy->Assign(type, this));
         *out = copy.Detach();
         return TOV_OK;

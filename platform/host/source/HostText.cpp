@@ -1,5 +1,6 @@
 #include "tov/host/HostText.h"
 
+#include "tov/host/CreateKnownComponent.h"
 #include "tov/host/HostString.h"
 #include "tov/sdk/TOVFailureStyle.h"
 #include "tov/sdk/TOVPtr.h"
@@ -11,7 +12,7 @@ TOVRESULT Make(std::string_view utf8, ITOVString** out) {
     *out = nullptr;
     TOVPtr<ITOVString> text;
     // The string component needs no host services, so it is made directly.
-    TOVRESULT result = HostString::TOVCreate(nullptr, nullptr, IID_ITOVString, text.Out());
+    TOVRESULT result = CreateKnownComponent<ITOVString, HostString>(text.OutT());
     if (result < 0) return result;
     result = text->Assign(kTOVUnicodeUTF8, reinterpret_cast<const unsigned char*>(utf8.data()),
                           static_cast<unsigned int>(utf8.size()));

@@ -3,6 +3,7 @@
 #include <string>
 #include <string_view>
 
+#include "tov/host/CreateKnownComponent.h"
 #include "tov/host/HostText.h"
 #include "tov/host/HostXmlDomAttribute.h"
 #include "tov/host/HostXmlDomElement.h"
@@ -53,7 +54,7 @@ std::string_view NodeValue(xmlDocPtr document, xmlNodePtr node, std::string& sto
 template <class View>
 TOVRESULT MakeView(const HostXmlDocumentRef& document, xmlNodePtr node, UTIL::ITOVXmlDomNode** out) {
     TOVPtr<UTIL::ITOVXmlDomNode> view;
-    TOVCheck(TOVCreateComponent<View>(nullptr, nullptr, UTIL::IID_ITOVXmlDomNode, view.Out()));
+    TOVCheck((CreateKnownComponent<UTIL::ITOVXmlDomNode, View>(view.OutT())));
     static_cast<View*>(view.Get())->Attach(document, node);
     *out = view.Detach();
     return TOV_OK;
