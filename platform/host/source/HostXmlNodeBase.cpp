@@ -2,6 +2,7 @@
 
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "tov/host/CreateKnownComponent.h"
 #include "tov/host/HostText.h"
@@ -94,18 +95,16 @@ TOVRESULT HostXmlNodeBase<Interface, ViewIID>::GetValue(ITOVString** out) {
 }
 
 template <class Interface, const _tovUID& ViewIID>
-const std::vector<xmlNodePtr>& HostXmlNodeBase<Interface, ViewIID>::Children() {
-    if (!m_HaveChildren) {
-        // Attributes are not children, and an attribute's own children are its value.
-        if (m_Node->type != XML_ATTRIBUTE_NODE) {
-            size_t count = 0;
-            for (xmlNodePtr child = m_Node->children; child; child = child->next) ++count;
-            m_Children.reserve(count);
-            for (xmlNodePtr child = m_Node->children; child; child = child->next) m_Children.push_back(child);
-        }
-        m_HaveChildren = true;
-    }
-    return m_Children;
+xmlNodePtr HostXmlNodeBase<Interface, ViewIID>::FirstChild() const {
+    // Attributes are not children, and an attribute's own children are its value.
+    return m_Node->type == XML_ATTRIBUTE_NODE ? nullptr : m_Node->children;
+}
+
+template <class Interface, const _tovUID& ViewIID>
+uint32_t HostXmlNodeBase<Interface, ViewIID>::GetChildCount() {
+    uint32_t count = 0;
+    for (xmlNodePtr child = FirstChild(); child; child = child->next) ++count;
+    return count;
 }
 
 template <class Interface, const _tovUID& ViewIID>
@@ -113,9 +112,13 @@ TOVRESULT HostXmlNodeBase<Interface, ViewIID>::GetChild(uint32_t index, UTIL::IT
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
         *out = nullptr;
-        const std::vector<xmlNodePtr>& children = Children();
-        if (index >= children.size()) return TOV_E_OUTOFRANGE;
-        return HostXmlNodes::Wrap(m_Document, children[index], out);
+        if (!m_Cursor || index < m_CursorIndex) {
+            m_Cursor = FirstChild();
+            m_CursorIndex = 0;
+        }
+        for (; m_Cursor && m_CursorIndex < index; ++m_CursorIndex) m_Cursor = m_Cursor->next;
+        if (!m_Cursor) return TOV_E_OUTOFRANGE;
+        return HostXmlNodes::Wrap(m_Document, m_Cursor, out);
     });
 }
 

@@ -78,6 +78,8 @@ TEST_F(HostXmlDom, ChildrenKeepDocumentOrderAndTheirTypes) {
     void* out = reinterpret_cast<void*>(1);
     EXPECT_EQ(root->GetChild(5, reinterpret_cast<ITOVXmlDomNode**>(&out)), TOV_E_OUTOFRANGE);
     EXPECT_EQ(out, nullptr);
+    EXPECT_EQ(Name(Child(root.Get(), 4).Get()), "pi") << "children are still found after one past the end";
+    EXPECT_EQ(Name(Child(root.Get(), 0).Get()), "#comment");
 }
 
 TEST_F(HostXmlDom, IndentationIsNotContent) {

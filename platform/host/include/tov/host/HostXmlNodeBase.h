@@ -4,7 +4,6 @@
 #include <libxml/tree.h>
 
 #include <memory>
-#include <vector>
 
 #include "tov/ITOVXmlDom.h"
 #include "tov/sdk/CTOVUnknown.h"
@@ -36,7 +35,7 @@ public:
     int32_t GetNodeType() override { return static_cast<int32_t>(m_Node->type); }
     TOVRESULT GetName(ITOVString** out) override;
     TOVRESULT GetValue(ITOVString** out) override;
-    uint32_t GetChildCount() override { return static_cast<uint32_t>(Children().size()); }
+    uint32_t GetChildCount() override;
     TOVRESULT GetChild(uint32_t index, UTIL::ITOVXmlDomNode** out) override;
     TOVRESULT GetAttributes(UTIL::ITOVXmlDomNodeList** out) override;
     TOVRESULT InternalQueryInterface(const _tovUID& iid, void** out) override;
@@ -46,9 +45,12 @@ protected:
     HostXmlDocumentRef m_Document;
 
 private:
-    /// Fetched once: libxml2 keeps children as a linked list.
-    const std::vector<xmlNodePtr>& Children();
+    /// The first child in libxml2's linked list of them, or null.
+    xmlNodePtr FirstChild() const;
 
-    std::vector<xmlNodePtr> m_Children;
-    bool m_HaveChildren = false;
+    /// The child last handed out and its index: children are mostly asked
+    /// for in order, and a parsed tree never changes, so each is found from
+    /// the one before.
+    xmlNodePtr m_Cursor = nullptr;
+    uint32_t m_CursorIndex = 0;
 };
