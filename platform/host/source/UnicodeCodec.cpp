@@ -1,10 +1,19 @@
 #include "tov/host/UnicodeCodec.h"
 
+#include <cstring>
+
 static_assert(sizeof(wchar_t) == 4, "wide text is handled as UTF-32");
 
 namespace {
 
 bool IsContinuation(unsigned char byte) { return (byte & 0xC0) == 0x80; }
+
+// Whether the eight bytes at `text` are all ASCII.
+bool EightASCII(const unsigned char* text) {
+    uint64_t bytes;
+    std::memcpy(&bytes, text, sizeof bytes);
+    return (bytes & 0x8080808080808080u) == 0;
+}
 
 // The length of the well-formed UTF-8 sequence at `text[i]`, whose code point
 // goes to `cp`; 0 for a malformed one.
@@ -106,10 +115,17 @@ bool DecodeUTF32Of(const Unit* text, size_t n, Text& out) {
 bool UnicodeCodec::IsScalarValue(uint32_t value) { return value <= 0x10FFFF && (value < 0xD800 || value > 0xDFFF); }
 
 bool UnicodeCodec::IsValidUTF8(const unsigned char* text, size_t n) {
-    uint32_t cp;
-    for (size_t i = 0, length; i < n; i += length) {
-        length = UTF8Sequence(text, n, i, cp);
+    size_t i = 0;
+    while (i < n) {
+        // Most text is ASCII, which is checked eight bytes at a time.
+        if (n - i >= 8 && EightASCII(text + i)) {
+            i += 8;
+            continue;
+        }
+        uint32_t cp;
+        const size_t length = UTF8Sequence(text, n, i, cp);
         if (length == 0) return false;
+        i += length;
     }
     return true;
 }

@@ -86,6 +86,11 @@ TEST(UnicodeCodecTest, RefusesMalformedUTF8AndKeepsTheOutput) {
     for (const auto& bytes : malformed) {
         SCOPED_TRACE(testing::PrintToString(bytes));
         EXPECT_FALSE(UnicodeCodec::IsValidUTF8(bytes.data(), bytes.size()));
+        for (size_t ascii : {7, 9}) {  // within and behind the ASCII read eight bytes at a time
+            std::vector<unsigned char> behind(ascii, 'a');
+            behind.insert(behind.end(), bytes.begin(), bytes.end());
+            EXPECT_FALSE(UnicodeCodec::IsValidUTF8(behind.data(), behind.size())) << ascii;
+        }
         std::u32string out = U"kept";
         EXPECT_FALSE(UnicodeCodec::DecodeUTF8(bytes.data(), bytes.size(), out));
         EXPECT_EQ(out, U"kept");
