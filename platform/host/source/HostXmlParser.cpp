@@ -36,8 +36,10 @@ TOVRESULT HostXmlParser::Parse(std::string_view bytes, const char* url, const ch
     xmlParserCtxtPtr context = xmlNewParserCtxt();
     if (!context) return TOV_E_OUTOFMEMORY;
     LibXmlSafety::RefuseEntities(*context->sax);
+    // The tree is only ever read, so short texts may be kept inside their
+    // nodes instead of in allocations of their own.
     xmlDocPtr document = xmlCtxtReadMemory(context, bytes.data(), static_cast<int>(bytes.size()), url, encoding,
-                                           LibXmlSafety::kOptions);
+                                           LibXmlSafety::kOptions | XML_PARSE_COMPACT);
     if (!document) m_LastError = LibXmlSafety::LastError(context, "the document is not well-formed XML");
     xmlFreeParserCtxt(context);
     if (!document) return TOV_E_FAIL;
