@@ -1,8 +1,6 @@
 #pragma once
 /// Making a host component whose class the host code knows.
-#include <new>
-
-#include "tov/sdk/CTOVUnknown.h"
+#include "tov/sdk/TOVComponent.h"
 
 /// TOVCreateComponent's steps for a class `T` made with no host and no outer
 /// unknown, handing out `Interface`, which `T` implements: no query for it, so
@@ -12,14 +10,9 @@
 template <class Interface, class T>
 TOVRESULT CreateKnownComponent(Interface** out) {
     *out = nullptr;
-    T* object = new (std::nothrow) T(nullptr);
-    if (!object) return TOV_E_OUTOFMEMORY;
-    object->InternalAddRef();
-    const TOVRESULT init = object->InitializeInstance(nullptr);
-    if (init < 0) {
-        delete object;
-        return init;
-    }
+    T* object = nullptr;
+    const TOVRESULT made = TOVConstructComponent(nullptr, nullptr, &object);
+    if (made < 0) return made;
     *out = static_cast<Interface*>(object);
     return TOV_OK;
 }
