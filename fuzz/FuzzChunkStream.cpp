@@ -2,7 +2,6 @@
 // any bytes. Each input is written to a memory file that the stream opens by
 // path, as it opens any file.
 #include <fcntl.h>
-#include <sys/mman.h>
 #include <unistd.h>
 
 #include <cstdint>
@@ -10,13 +9,13 @@
 #include <stdexcept>
 #include <string>
 
-#include "reader/OrloStream.h"
 #include "FuzzHost.h"
+#include "FuzzInputFile.h"
+#include "reader/OrloStream.h"
 
 namespace {
 
-int g_memoryFile = -1;
-std::string g_path;
+FuzzInputFile* g_input = nullptr;
 
 // The lowest free descriptor: a stream that left its file open takes it.
 int LowestFreeDescriptor() {
@@ -39,19 +38,16 @@ void Ask(Get get) {
 extern "C" int LLVMFuzzerInitialize(int*, char***) {
     // The reader logs through the utility library, which needs a host.
     StartFuzzHost();
-    g_memoryFile = memfd_create("orlo-fuzz", 0);
-    if (g_memoryFile < 0) std::abort();
-    g_path = "/proc/self/fd/" + std::to_string(g_memoryFile);
+    g_input = new FuzzInputFile("orlo-fuzz");
     return 0;
 }
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-    if (ftruncate(g_memoryFile, 0) != 0) std::abort();
-    if (size > 0 && pwrite(g_memoryFile, data, size, 0) != static_cast<ssize_t>(size)) std::abort();
+    g_input->Write(data, size);
 
     const int free = LowestFreeDescriptor();
     {
-        const Orlo::OrloStream stream(g_path.c_str(), 255);
+        const Orlo::OrloStream stream(g_input->Path().c_str(), 255);
         Ask([&] { return stream.GetChannelCount(); });
         Ask([&] { return stream.GetBitsPerSample(); });
         Ask([&] { return stream.GetIsDataFloatingPoint(); });

@@ -2,15 +2,12 @@
 // iXML, the rules of trust, start timecode, identity, tracks) over any bytes.
 // The first byte of the input also switches the five toggles, so that every
 // route of the rules is reached.
-#include <fcntl.h>
-#include <sys/mman.h>
-#include <unistd.h>
-
 #include <cstdint>
 #include <cstdlib>
 #include <string>
 
 #include "FuzzHost.h"
+#include "FuzzInputFile.h"
 #include "boundary/DynamicToggles.h"
 #include "boundary/ModuleGlobals.h"
 #include "boundary/OrloConstants.h"
@@ -18,8 +15,7 @@
 
 namespace {
 
-int g_memoryFile = -1;
-std::string g_path;
+FuzzInputFile* g_input = nullptr;
 TOVPtr<ITOVComponentFactory> g_factory;
 
 const char* const kToggles[] = {toggle_MobIDFromiXML, toggle_StartTimeCodeFromFileCreationTime,
@@ -35,22 +31,19 @@ extern "C" int LLVMFuzzerInitialize(int*, char***) {
     OrloReader::InitOrloReader(factory);
     if (factory->QueryInterface(IID_ITOVConsole, reinterpret_cast<void**>(&g_pConsole)) < 0) std::abort();
     ZEB::Impl::RegisterDynamicToggles(g_factory);
-    g_memoryFile = memfd_create("orlo-fuzz-movie", 0);
-    if (g_memoryFile < 0) std::abort();
-    g_path = "/proc/self/fd/" + std::to_string(g_memoryFile);
+    g_input = new FuzzInputFile("orlo-fuzz-movie");
     return 0;
 }
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
-    if (ftruncate(g_memoryFile, 0) != 0) std::abort();
-    if (size > 0 && pwrite(g_memoryFile, data, size, 0) != static_cast<ssize_t>(size)) std::abort();
+    g_input->Write(data, size);
     const unsigned bits = size > 0 ? data[0] : 0;
     for (unsigned i = 0; i < 5; ++i)
         if (ZEB::Impl::SetDynamicToggleValue(g_factory, kToggles[i], (bits >> i) & 1) != 0) std::abort();
 
     OrloReader::Movie movie;
-    const TOVRESULT result = movie.InitFromFile(ZEB::ZEBString(reinterpret_cast<const unsigned char*>(g_path.c_str())),
-                                                g_factory.Get(), true);
+    const TOVRESULT result = movie.InitFromFile(
+        ZEB::ZEBString(reinterpret_cast<const unsigned char*>(g_input->Path().c_str())), g_factory.Get(), true);
     if (result == 0) {
         // A finished movie always starts with its timecode track.
         if (movie.GetTrackCount() == 0 || movie.GetTrack(0)->GetMedia()->GetType() != OrloReader::kMediaTypeTimecode)
