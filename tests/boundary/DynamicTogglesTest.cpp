@@ -65,28 +65,17 @@ TEST_F(TogglesOnAHost, RegistersTheFiveTogglesOffInTheirOrderAndGroup) {
     }
 }
 
-TEST_F(TogglesOnAHost, ARegisteredToggleKeepsItsValueAcrossStartUps) {
+TEST_F(TogglesOnAHost, RegisteringAgainKeepsEveryValueAlreadyThere) {
+    ASSERT_EQ(manager->RegisterToggle(toggle_MobIDFromiXML, 1, "host"), TOV_OK);
     RegisterDynamicToggles(factory);
     ASSERT_EQ(SetDynamicToggleValue(factory, toggle_StartTimeCodeFromBEXTOriginationDate, 1), TOV_OK);
     RegisterDynamicToggles(factory);
     EXPECT_EQ(Read(toggle_StartTimeCodeFromBEXTOriginationDate, TOV_OK), 1u);
-    EXPECT_EQ(Read(toggle_MobIDFromiXML, TOV_OK), 0u);
-}
-
-TEST_F(TogglesOnAHost, AToggleTheHostRegisteredFirstKeepsItsDefault) {
-    ASSERT_EQ(manager->RegisterToggle(toggle_MobIDFromiXML, 1, "host"), TOV_OK);
-    RegisterDynamicToggles(factory);
     EXPECT_EQ(Read(toggle_MobIDFromiXML, TOV_OK), 1u);
+    EXPECT_EQ(Read(toggle_IgnoreHostSettingsForUnitTest, TOV_OK), 0u);
     uint32_t count = 0;
     ASSERT_EQ(manager->GetToggleCount(&count), TOV_OK);
     EXPECT_EQ(count, 5u);
-}
-
-TEST_F(TogglesOnAHost, UnregisteredTogglesCannotBeReadOrSet) {
-    // The caller's 0 stays: a toggle that cannot be read counts as off.
-    EXPECT_EQ(Read(toggle_MobIDFromiXML, ZEB_E_NOTFOUND), 0u);
-    EXPECT_EQ(SetDynamicToggleValue(factory, toggle_MobIDFromiXML, 1), ZEB_E_NOTFOUND);
-    EXPECT_EQ(manager->IsToggleRegistered(toggle_MobIDFromiXML), 0);
 }
 
 TEST_F(TogglesOnAHost, NoFactoryIsNoInterfaceAndRegistersNothing) {
@@ -97,10 +86,9 @@ TEST_F(TogglesOnAHost, NoFactoryIsNoInterfaceAndRegistersNothing) {
     EXPECT_EQ(SetDynamicToggleValue(none, toggle_MobIDFromiXML, 1), TOV_E_NOINTERFACE);
 }
 
-// A manager stand-in behind a factory stand-in.
-class TogglesOnStandIns : public ::testing::Test {
-protected:
-    TogglesOnStandIns() {
+// A manager stand-in behind a factory stand-in, every slot succeeding.
+struct StandIns {
+    StandIns() {
         ON_CALL(factory, CreateComponent(TOVCompID_FTFManager, nullptr, IID_IFTFManager, _))
             .WillByDefault(HandOut<IFTFManager>(&manager));
         ON_CALL(manager, IsToggleRegistered(_)).WillByDefault(Return(1));
@@ -114,6 +102,16 @@ protected:
     NiceMock<MockManager> manager;
     TOVPtr<ITOVComponentFactory> held;
 };
+
+// What `call` threw as a result, or TOV_OK when it threw nothing.
+TOVRESULT Thrown(const std::function<void()>& call) {
+    try {
+        call();
+    } catch (int result) {
+        return result;
+    }
+    return TOV_OK;
+}
 
 struct AccessCase {
     const char* name;
@@ -155,53 +153,39 @@ const AccessCase kAccessCases[] = {
 TEST(ToggleAccess, ReadAndSetReportEachFailureAsTheirOwn) {
     for (const AccessCase& c : kAccessCases) {
         SCOPED_TRACE(c.name);
-        NiceMock<MockFactory> caseFactory;
-        NiceMock<MockManager> caseManager;
-        ON_CALL(caseFactory, CreateComponent(_, _, _, _)).WillByDefault(HandOut<IFTFManager>(&caseManager));
-        ON_CALL(caseManager, IsToggleRegistered(_)).WillByDefault(Return(1));
-        c.arrange(caseFactory, caseManager);
+        StandIns s;
+        c.arrange(s.factory, s.manager);
         unsigned int value = 0;
-        EXPECT_EQ(RetrieveDynamicToggleValue(&caseFactory, toggle_MobIDFromiXML, &value), c.read);
+        EXPECT_EQ(RetrieveDynamicToggleValue(&s.factory, toggle_MobIDFromiXML, &value), c.read);
         EXPECT_EQ(value, 0u);
-        TOVPtr<ITOVComponentFactory> caseHeld;
-        caseHeld.Assign(&caseFactory);
-        EXPECT_EQ(SetDynamicToggleValue(caseHeld, toggle_MobIDFromiXML, 1), c.set);
+        EXPECT_EQ(SetDynamicToggleValue(s.held, toggle_MobIDFromiXML, 1), c.set);
     }
 }
 
-TEST_F(TogglesOnStandIns, RegistrationThrowsTheFactorysFailure) {
-    ON_CALL(factory, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(ZEB_E_NOTFOUND));
-    try {
-        RegisterDynamicToggles(held);
-        ADD_FAILURE() << "a host without a toggle manager must fail the start-up";
-    } catch (int result) {
-        EXPECT_EQ(result, ZEB_E_NOTFOUND);
-    }
+TEST(ToggleRegistration, ThrowsTheFactorysFailureAndSkipsAMissingManager) {
+    StandIns failing;
+    ON_CALL(failing.factory, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(ZEB_E_NOTFOUND));
+    EXPECT_EQ(Thrown([&] { RegisterDynamicToggles(failing.held); }), ZEB_E_NOTFOUND);
+
+    StandIns none;
+    ON_CALL(none.factory, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(TOV_OK));
+    EXPECT_CALL(none.manager, RegisterToggle(_, _, _)).Times(0);
+    EXPECT_EQ(Thrown([&] { RegisterDynamicToggles(none.held); }), TOV_OK);
 }
 
-TEST_F(TogglesOnStandIns, RegistrationWithoutAManagerDoesNothing) {
-    ON_CALL(factory, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(TOV_OK));
-    EXPECT_CALL(manager, RegisterToggle(_, _, _)).Times(0);
-    EXPECT_NO_THROW(RegisterDynamicToggles(held));
-}
-
-TEST_F(TogglesOnStandIns, RegistrationSkipsRegisteredTogglesAndStopsAtTheFirstFailure) {
-    ON_CALL(manager, IsToggleRegistered(_)).WillByDefault(Return(0));
-    ON_CALL(manager, IsToggleRegistered(::testing::StrEq(toggle_MobIDFromiXML))).WillByDefault(Return(1));
+TEST(ToggleRegistration, SkipsRegisteredTogglesAndThrowsTheFirstFailure) {
+    StandIns s;
+    ON_CALL(s.manager, IsToggleRegistered(_)).WillByDefault(Return(0));
+    ON_CALL(s.manager, IsToggleRegistered(::testing::StrEq(toggle_MobIDFromiXML))).WillByDefault(Return(1));
     {
         ::testing::InSequence order;
-        EXPECT_CALL(manager, RegisterToggle(::testing::StrEq(toggle_StartTimeCodeFromFileCreationTime), 0u,
-                                            ::testing::StrEq(kOrloFeatureGroup)))
+        EXPECT_CALL(s.manager, RegisterToggle(::testing::StrEq(toggle_StartTimeCodeFromFileCreationTime), 0u,
+                                              ::testing::StrEq(kOrloFeatureGroup)))
             .WillOnce(Return(TOV_OK));
-        EXPECT_CALL(manager, RegisterToggle(::testing::StrEq(toggle_IgnoreHostSettingsForUnitTest), 0u, _))
+        EXPECT_CALL(s.manager, RegisterToggle(::testing::StrEq(toggle_IgnoreHostSettingsForUnitTest), 0u, _))
             .WillOnce(Return(TOV_E_OUTOFMEMORY));
     }
-    try {
-        RegisterDynamicToggles(held);
-        ADD_FAILURE() << "a failed registration must be thrown";
-    } catch (int result) {
-        EXPECT_EQ(result, TOV_E_OUTOFMEMORY);
-    }
+    EXPECT_EQ(Thrown([&] { RegisterDynamicToggles(s.held); }), TOV_E_OUTOFMEMORY);
 }
 
 }  // namespace

@@ -22,12 +22,6 @@ protected:
     TOVPtr<IHostSettings> settings = NewSettings(host.Get());
 };
 
-TEST_F(HostSettingsTest, AnUnsetSettingIsNotFoundAndLeavesTheValue) {
-    uint32_t value = 0xDEAD;
-    EXPECT_EQ(settings->GetSetting(kGrouping, 16, &value), ZEB_E_NOTFOUND);
-    EXPECT_EQ(value, 0xDEADu);
-}
-
 TEST_F(HostSettingsTest, AreSharedByTheSettingsObjectsOfOneHostOnly) {
     ASSERT_EQ(settings->SetSetting(kGrouping, 32, 0), TOV_OK);
     ASSERT_EQ(settings->SetSetting(kOtherSetting, 32, 5), TOV_OK);
@@ -42,7 +36,9 @@ TEST_F(HostSettingsTest, AreSharedByTheSettingsObjectsOfOneHostOnly) {
     EXPECT_EQ(value, 5u);
 
     TestHost otherHost;
+    value = 0xDEAD;
     EXPECT_EQ(NewSettings(otherHost.Get())->GetSetting(kGrouping, 16, &value), ZEB_E_NOTFOUND);
+    EXPECT_EQ(value, 0xDEADu) << "an unset setting leaves the value";
 }
 
 struct SizeCase {
@@ -51,8 +47,7 @@ struct SizeCase {
 };
 
 TEST_F(HostSettingsTest, AnySizeUpTo32BitsReadsAndWritesTheWholeValue) {
-    const SizeCase cases[] = {{0, TOV_E_INVALIDARG}, {1, TOV_OK},  {8, TOV_OK},
-                              {16, TOV_OK},          {32, TOV_OK}, {33, TOV_E_INVALIDARG}};
+    const SizeCase cases[] = {{0, TOV_E_INVALIDARG}, {1, TOV_OK}, {32, TOV_OK}, {33, TOV_E_INVALIDARG}};
     for (const SizeCase& c : cases) {
         SCOPED_TRACE(c.size);
         EXPECT_EQ(settings->SetSetting(kGrouping, c.size, 0x12345678u + c.size), c.expected);

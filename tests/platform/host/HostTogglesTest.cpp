@@ -3,6 +3,7 @@
 
 #include <functional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "TestHost.h"
@@ -102,63 +103,39 @@ TEST_F(HostToggles, ResetGoesBackToTheDefaultAndUnregisterForgetsTheValue) {
     EXPECT_EQ(ValueOf(*manager, kPath), 2u);
 }
 
-struct SlotCase {
-    const char* name;
-    std::function<TOVRESULT(IFTFManager&, const char* path)> call;
-};
-
-// Every slot that takes a path, called with a path that is not registered and with none.
-const SlotCase kPathSlots[] = {
-    {"GetToggleGroup",
-     [](IFTFManager& m, const char* p) {
-         ITOVString* group = nullptr;
-         const TOVRESULT result = m.GetToggleGroup(p, &group);
-         EXPECT_EQ(group, nullptr);
-         return result;
-     }},
-    {"GetToggleDefault",
-     [](IFTFManager& m, const char* p) {
-         uint32_t value = 0xDEAD;
-         const TOVRESULT result = m.GetToggleDefault(p, &value);
-         EXPECT_EQ(value, 0xDEADu);
-         return result;
-     }},
-    {"GetToggleValue",
-     [](IFTFManager& m, const char* p) {
-         uint32_t value = 0xDEAD;
-         const TOVRESULT result = m.GetToggleValue(p, &value);
-         EXPECT_EQ(value, 0xDEADu);
-         return result;
-     }},
-    {"SetToggleValue", [](IFTFManager& m, const char* p) { return m.SetToggleValue(p, 1); }},
-    {"ResetToggle", [](IFTFManager& m, const char* p) { return m.ResetToggle(p); }},
-    {"UnregisterToggle", [](IFTFManager& m, const char* p) { return m.UnregisterToggle(p); }},
-};
-
-TEST_F(HostToggles, UnknownPathsAreNotFoundAndNullPathsInvalid) {
+TEST_F(HostToggles, UnknownPathsAreNotFoundAndNullPathsOrPlacesInvalid) {
     ASSERT_EQ(manager->RegisterToggle(kOther, 0, "g"), TOV_OK);
-    for (const SlotCase& slot : kPathSlots) {
-        SCOPED_TRACE(slot.name);
-        EXPECT_EQ(slot.call(*manager, kPath), ZEB_E_NOTFOUND);
-        EXPECT_EQ(slot.call(*manager, "/area/other"), ZEB_E_NOTFOUND);  // paths keep their case
-        EXPECT_EQ(slot.call(*manager, nullptr), TOV_E_INVALIDARG);
+    ITOVString* group = nullptr;
+    uint32_t value = 0xDEAD;
+    // Every slot that takes a path.
+    const std::pair<const char*, std::function<TOVRESULT(const char*)>> slots[] = {
+        {"GetToggleGroup", [&](const char* p) { return manager->GetToggleGroup(p, &group); }},
+        {"GetToggleDefault", [&](const char* p) { return manager->GetToggleDefault(p, &value); }},
+        {"GetToggleValue", [&](const char* p) { return manager->GetToggleValue(p, &value); }},
+        {"SetToggleValue", [&](const char* p) { return manager->SetToggleValue(p, 1); }},
+        {"ResetToggle", [&](const char* p) { return manager->ResetToggle(p); }},
+        {"UnregisterToggle", [&](const char* p) { return manager->UnregisterToggle(p); }},
+    };
+    for (const auto& [name, call] : slots) {
+        SCOPED_TRACE(name);
+        EXPECT_EQ(call(kPath), ZEB_E_NOTFOUND);
+        EXPECT_EQ(call("/area/other"), ZEB_E_NOTFOUND);  // paths keep their case
+        EXPECT_EQ(call(nullptr), TOV_E_INVALIDARG);
     }
+    EXPECT_EQ(group, nullptr);
+    EXPECT_EQ(value, 0xDEADu);
     EXPECT_EQ(manager->IsToggleRegistered(kPath), 0);
     EXPECT_EQ(manager->IsToggleRegistered(nullptr), 0);
-    EXPECT_EQ(manager->IsToggleRegistered(kOther), 1);
     EXPECT_EQ(ValueOf(*manager, kOther), 0u);  // nothing above touched the registered one
-}
 
-TEST_F(HostToggles, NullPlacesForResultsAreInvalid) {
-    ASSERT_EQ(manager->RegisterToggle(kPath, 0, "g"), TOV_OK);
-    EXPECT_EQ(manager->RegisterToggle(kOther, 0, nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->RegisterToggle(kPath, 0, nullptr), TOV_E_INVALIDARG);
     EXPECT_EQ(manager->RegisterToggle(nullptr, 0, "g"), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->IsToggleRegistered(kPath), 0);
     EXPECT_EQ(manager->GetToggleCount(nullptr), TOV_E_INVALIDARG);
     EXPECT_EQ(manager->GetTogglePath(0, nullptr), TOV_E_INVALIDARG);
-    EXPECT_EQ(manager->GetToggleGroup(kPath, nullptr), TOV_E_INVALIDARG);
-    EXPECT_EQ(manager->GetToggleDefault(kPath, nullptr), TOV_E_INVALIDARG);
-    EXPECT_EQ(manager->GetToggleValue(kPath, nullptr), TOV_E_INVALIDARG);
-    EXPECT_EQ(manager->IsToggleRegistered(kOther), 0);
+    EXPECT_EQ(manager->GetToggleGroup(kOther, nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->GetToggleDefault(kOther, nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(manager->GetToggleValue(kOther, nullptr), TOV_E_INVALIDARG);
 }
 
 TEST_F(HostToggles, AManagerOutlivingItsHostKeepsTheToggles) {

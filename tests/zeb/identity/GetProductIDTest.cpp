@@ -10,11 +10,9 @@ namespace {
 
 constexpr _tovUID kProductID = {0x3711D3CC, 0x62D0, 0x49D7, {0xB0, 0xAE, 0xC1, 0x18, 0x10, 0x1D, 0x1A, 0x16}};
 
-TEST(GetProductID, FillsTheRecordWithTheCallersTextsAndTheStaticPlatform) {
-    const wchar_t* company = L"Orrin Technology, Inc.";
-    const wchar_t* product = L"Orlo Plug-In";
-    const wchar_t* version = L"1.9.1.10178";
-    _aafProductIdentification_t id{};
+TEST(GetProductID, FillsTheRecordAndEveryCallRewritesTheOneVersionRecord) {
+    const wchar_t *company = L"a", *product = L"b", *version = L"c";
+    _aafProductIdentification_t id{}, later{};
     ZEB::GetProductID(id, 1, 9, 1, 10178, company, product, version, kProductID);
     EXPECT_EQ(id.companyName, company);
     EXPECT_EQ(id.productName, product);
@@ -28,15 +26,11 @@ TEST(GetProductID, FillsTheRecordWithTheCallersTextsAndTheStaticPlatform) {
     EXPECT_EQ(id.productVersion->tertiary, 1);
     EXPECT_EQ(id.productVersion->patchLevel, 10178);
     EXPECT_EQ(id.productVersion->type, kAAFVersionUnknown);
-}
 
-TEST(GetProductID, EveryCallRewritesTheOneVersionRecord) {
-    _aafProductIdentification_t first{}, second{};
-    ZEB::GetProductID(first, 1, 2, 3, 4, L"a", L"b", L"c", kProductID);
-    ZEB::GetProductID(second, 5, 6, 7, 8, L"a", L"b", L"c", kProductID);
-    EXPECT_EQ(first.productVersion, second.productVersion);
-    EXPECT_EQ(first.platform, second.platform);
-    EXPECT_EQ(first.productVersion->major, 5) << "the earlier record sees the later numbers";
+    ZEB::GetProductID(later, 5, 6, 7, 8, company, product, version, kProductID);
+    EXPECT_EQ(id.productVersion, later.productVersion);
+    EXPECT_EQ(id.platform, later.platform);
+    EXPECT_EQ(id.productVersion->major, 5) << "the earlier record sees the later numbers";
 }
 
 }  // namespace

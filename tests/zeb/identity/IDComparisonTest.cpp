@@ -16,25 +16,22 @@ ID WithByteSet(std::size_t index) {
     return id;
 }
 
-TEST(IDComparison, UIDsDifferingInAnyByteAreUnequalAndNotNull) {
-    EXPECT_TRUE(IsNullUID(UID_NULL));
-    EXPECT_TRUE(IsEqualUID(UID_NULL, _aafUID_t{}));
-    for (std::size_t i = 0; i < sizeof(_aafUID_t); ++i) {
-        const _aafUID_t id = WithByteSet<_aafUID_t>(i);
-        EXPECT_FALSE(IsNullUID(id)) << "byte " << i;
-        EXPECT_FALSE(IsEqualUID(id, UID_NULL)) << "byte " << i;
-        EXPECT_TRUE(IsEqualUID(id, WithByteSet<_aafUID_t>(i))) << "byte " << i;
+// Every one-byte change of `null` is unequal to it, not null, and equal to itself.
+template <class ID>
+void ExpectEveryByteCounts(const ID& null, bool (*isNull)(const ID&), bool (*isEqual)(const ID&, const ID&)) {
+    EXPECT_TRUE(isNull(null));
+    EXPECT_TRUE(isEqual(null, ID{}));
+    for (std::size_t i = 0; i < sizeof(ID); ++i) {
+        const ID id = WithByteSet<ID>(i);
+        EXPECT_FALSE(isNull(id)) << "byte " << i;
+        EXPECT_FALSE(isEqual(id, null)) << "byte " << i;
+        EXPECT_TRUE(isEqual(id, WithByteSet<ID>(i))) << "byte " << i;
     }
 }
 
-TEST(IDComparison, MobIDsDifferingInAnyByteAreUnequalAndNotNull) {
-    EXPECT_TRUE(IsNullMobID(MOBID_NULL));
-    for (std::size_t i = 0; i < sizeof(_aafMobID_t); ++i) {
-        const _aafMobID_t id = WithByteSet<_aafMobID_t>(i);
-        EXPECT_FALSE(IsNullMobID(id)) << "byte " << i;
-        EXPECT_FALSE(IsEqualMobID(id, MOBID_NULL)) << "byte " << i;
-        EXPECT_TRUE(IsEqualMobID(id, WithByteSet<_aafMobID_t>(i))) << "byte " << i;
-    }
+TEST(IDComparison, IdentifiersDifferingInAnyByteAreUnequalAndNotNull) {
+    ExpectEveryByteCounts<_aafUID_t>(UID_NULL, IsNullUID, IsEqualUID);
+    ExpectEveryByteCounts<_aafMobID_t>(MOBID_NULL, IsNullMobID, IsEqualMobID);
 }
 
 }  // namespace
