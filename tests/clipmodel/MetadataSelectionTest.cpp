@@ -108,7 +108,6 @@ TEST_F(ClipTest, CircledTakesIxmlThenOnlyTheExactBextWords) {
         {"sCIRCLED=TRUE\r\n", "", true},
         {"sCIRCLED=FALSE\r\n", "", false},
         {"sCIRCLED=true\r\n", "", std::nullopt},
-        {"sCIRCLED=YES\r\n", "", std::nullopt},
         {"-", "", std::nullopt},
     };
     for (const auto& c : cases) {
@@ -116,26 +115,6 @@ TEST_F(ClipTest, CircledTakesIxmlThenOnlyTheExactBextWords) {
         EXPECT_EQ(movie.HasMovieCircled() ? std::optional<bool>(movie.GetMovieCircled()) : std::nullopt, c.circled)
             << c.keywords << c.ixmlBody;
     }
-}
-
-TEST_F(ClipTest, IxmlOnlyAttributesCopyValueAndFlag) {
-    const Movie movie = LoadFile(FileOf("-",
-                                        "<PROJECT>Night Shoot</PROJECT><USER>Boom: Sam</USER>"
-                                        "<WILD_TRACK>TRUE</WILD_TRACK><NO_GOOD>FALSE</NO_GOOD>"));
-    EXPECT_TRUE(movie.HasMovieProject());
-    EXPECT_EQ(movie.GetMovieProject(), "Night Shoot");
-    EXPECT_TRUE(movie.HasMovieUserComments());
-    EXPECT_EQ(movie.GetMovieUserComments(), "Boom: Sam");
-    EXPECT_TRUE(movie.HasMovieWildTrack());
-    EXPECT_TRUE(movie.GetMovieWildTrack());
-    EXPECT_TRUE(movie.HasMovieNoGood());
-    EXPECT_FALSE(movie.GetMovieNoGood());
-    EXPECT_FALSE(movie.HasMovieFalseStart());
-
-    const Movie bare = LoadFile(FileOf("-", "<SCENE>1</SCENE>"));
-    EXPECT_FALSE(bare.HasMovieProject());
-    EXPECT_FALSE(bare.HasMovieUserComments());
-    EXPECT_FALSE(bare.HasMovieWildTrack());
 }
 
 TEST_F(ClipTest, DigitizerRateMarksPulledRecordings) {
