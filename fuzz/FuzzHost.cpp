@@ -4,7 +4,7 @@
 
 #include "startup/ZEBUtilLib.h"
 
-ITOVComponentFactory* StartFuzzHost() {
+TOVHost* StartFuzzHost() {
     static TOVPtr<TOVHost> host = TOVHost::Create();
     host->Console().SetVerbosity(~0u);
     host->Console().SetSink([](uint32_t, const std::string&) {});

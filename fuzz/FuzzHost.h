@@ -3,5 +3,5 @@
 /// with the utility library on it and every console line formatted, then dropped.
 #include "tov/host/TOVHost.h"
 
-/// The host's factory; aborts when the host's services cannot start.
-ITOVComponentFactory* StartFuzzHost();
+/// The host, which is also its factory; aborts when its services cannot start.
+TOVHost* StartFuzzHost();

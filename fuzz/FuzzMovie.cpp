@@ -8,8 +8,8 @@
 
 #include "FuzzHost.h"
 #include "FuzzInputFile.h"
+#include "PluginStartup.h"
 #include "boundary/DynamicToggles.h"
-#include "boundary/ModuleGlobals.h"
 #include "boundary/OrloConstants.h"
 #include "clipmodel/Movie.h"
 
@@ -25,12 +25,11 @@ const char* const kToggles[] = {toggle_MobIDFromiXML, toggle_StartTimeCodeFromFi
 }  // namespace
 
 extern "C" int LLVMFuzzerInitialize(int*, char***) {
-    ITOVComponentFactory* factory = StartFuzzHost();
-    g_factory.Assign(factory);
-    // The plug-in's globals, as its start-up sets them.
-    OrloReader::InitOrloReader(factory);
-    if (factory->QueryInterface(IID_ITOVConsole, reinterpret_cast<void**>(&g_pConsole)) < 0) std::abort();
-    ZEB::Impl::RegisterDynamicToggles(g_factory);
+    TOVHost* host = StartFuzzHost();
+    g_factory.Assign(host);
+    // The plug-in's globals, as its start-up sets them, for the whole run.
+    static PluginStartup startup(*host);
+    if (startup.Result() != TOV_OK) std::abort();
     g_input = new FuzzInputFile("orlo-fuzz-movie");
     return 0;
 }

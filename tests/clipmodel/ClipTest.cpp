@@ -8,7 +8,6 @@
 
 #include "AudioFileWriter.h"
 #include "boundary/DynamicToggles.h"
-#include "boundary/ModuleGlobals.h"
 #include "startup/ZEBUtilLib.h"
 
 std::string ClipFile::Bytes() const {
@@ -46,18 +45,13 @@ void ClipTest::SetUp() {
     ASSERT_NE(mkdtemp(pattern), nullptr);
     folder = pattern;
     ASSERT_EQ(ZEB::ZEBInitialize(host.Get()), TOV_OK);
-    OrloReader::InitOrloReader(host->AsUnknown());
-    ASSERT_EQ(host->QueryInterface(IID_ITOVConsole, reinterpret_cast<void**>(&g_pConsole)), TOV_OK);
-    TOVPtr<ITOVComponentFactory> factory;
-    factory.Assign(host.Get());
-    ZEB::Impl::RegisterDynamicToggles(factory);
+    startup = std::make_unique<PluginStartup>(*host);
+    ASSERT_EQ(startup->Result(), TOV_OK);
     host.ClearLines();
 }
 
 void ClipTest::TearDown() {
-    if (g_pConsole != nullptr) g_pConsole->Release();
-    g_pConsole = nullptr;
-    OrloReader::ShutdownOrloReader();
+    startup.reset();
     ZEB::ZEBTerminate();
     std::filesystem::remove_all(folder);
 }

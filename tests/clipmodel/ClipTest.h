@@ -4,10 +4,12 @@
 /// files into a folder of its own.
 #include <gtest/gtest.h>
 
+#include <memory>
 #include <optional>
 #include <string>
 
 #include "ChunkPayloads.h"
+#include "PluginStartup.h"
 #include "TestHost.h"
 #include "clipmodel/Movie.h"
 
@@ -49,4 +51,5 @@ protected:
 
     std::string folder;
     TestHost host;
+    std::unique_ptr<PluginStartup> startup;
 };
