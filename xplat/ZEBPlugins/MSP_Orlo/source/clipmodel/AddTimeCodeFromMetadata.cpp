@@ -5,6 +5,7 @@
 
 #include "boundary/ModuleGlobals.h"
 #include "boundary/OrloConstants.h"
+#include "clipmodel/FindBextKeyword.h"
 #include "clipmodel/FrameRateTable.h"
 #include "clipmodel/GetFileCreationTime.h"
 #include "clipmodel/IsToggleOn.h"
@@ -20,9 +21,8 @@ namespace {
 
 // The rate found from a `bext` Description keyword, if its value names one.
 bool RateFromKeyword(const Chunks::BEXT::BEXTChunk& bext, const char* key, _aafRational_t& rate, bool& drop) {
-    const auto& keywords = bext.GetConstParsedDescriptionField();
-    const auto found = keywords.find(key);
-    return found != keywords.end() && HelperFunctions::StringToFrameRate(found->second, rate, drop);
+    std::string value;
+    return FindBextKeyword(&bext, key, value) && HelperFunctions::StringToFrameRate(value, rate, drop);
 }
 
 TimeCodeInfo StartFromSamples(unsigned long long samples, double sampleRate, double fps, int fpsInt, bool drop) {
@@ -151,8 +151,9 @@ void AddTimeCodeFromMetadata(const Chunks::BEXT::BEXTChunk* bext, bool hasBext, 
     movie.SetMovieTimeCode(start);
     movie.SetHasMovieTimeCode(true);
 
+    // The file's own timecode is the same start, kept only for a file on tape.
     if (hasIxml && ixml.HasTape()) {
-        movie.SetMovieFileTimeCode(StartFromSamples(startSamples, workingRate, fps, fpsInt, drop));
+        movie.SetMovieFileTimeCode(start);
         movie.SetHasMovieFileTimeCode(true);
     }
 

@@ -1,7 +1,8 @@
 #include "clipmodel/MetadataSelection.h"
 
-#include <map>
+#include <optional>
 
+#include "clipmodel/FindBextKeyword.h"
 #include "clipmodel/GetFileCreationTime.h"
 #include "clipmodel/TextHelpers.h"
 #include "reader/IXMLTextParsers.h"
@@ -14,12 +15,7 @@ using Chunks::IXML::UTF8Text;
 
 // The value of a `bext` Description keyword, if the file has one.
 bool FindKeyword(const BEXTChunk* bext, bool hasBext, const char* key, std::string& value) {
-    if (!hasBext || bext == nullptr) return false;
-    const auto& keywords = bext->GetConstParsedDescriptionField();
-    const auto found = keywords.find(key);
-    if (found == keywords.end()) return false;
-    value = found->second;
-    return true;
+    return hasBext && FindBextKeyword(bext, key, value);
 }
 
 // The fixed `bext` text fields are padded with zero bytes; their text ends
@@ -38,33 +34,26 @@ std::string DashedDate(std::string date) {
 }
 
 // Scene and take follow the same rule: iXML, then the keyword, even when empty.
-template <typename HasIxml, typename GetIxml, typename Set, typename SetHas>
-void AddIxmlOrKeyword(const BEXTChunk* bext, bool hasBext, bool hasIxml, const char* key, HasIxml hasIxmlValue,
-                      GetIxml getIxml, Set set, SetHas setHas) {
+std::optional<std::string> IxmlOrKeyword(bool fromIxml, const ZEB::ZEBString& ixmlValue, const BEXTChunk* bext,
+                                         bool hasBext, const char* key) {
+    if (fromIxml) return UTF8Text(ixmlValue);
     std::string keyword;
-    if (hasIxml && hasIxmlValue()) {
-        set(UTF8Text(getIxml()));
-        setHas(true);
-    } else if (FindKeyword(bext, hasBext, key, keyword)) {
-        set(keyword);
-        setHas(true);
-    } else {
-        setHas(false);
-    }
+    if (FindKeyword(bext, hasBext, key, keyword)) return keyword;
+    return std::nullopt;
 }
 
 }  // namespace
 
 void AddSceneFromMetadata(const BEXTChunk* bext, bool hasBext, const IXMLData& ixml, bool hasIxml, Movie& movie) {
-    AddIxmlOrKeyword(
-        bext, hasBext, hasIxml, "SCENE", [&] { return ixml.HasScene(); }, [&] { return ixml.GetScene(); },
-        [&](const std::string& v) { movie.SetMovieScene(v); }, [&](bool has) { movie.SetHasMovieScene(has); });
+    const auto scene = IxmlOrKeyword(hasIxml && ixml.HasScene(), ixml.GetScene(), bext, hasBext, "SCENE");
+    if (scene) movie.SetMovieScene(*scene);
+    movie.SetHasMovieScene(scene.has_value());
 }
 
 void AddTakeFromMetadata(const BEXTChunk* bext, bool hasBext, const IXMLData& ixml, bool hasIxml, Movie& movie) {
-    AddIxmlOrKeyword(
-        bext, hasBext, hasIxml, "TAKE", [&] { return ixml.HasTake(); }, [&] { return ixml.GetTake(); },
-        [&](const std::string& v) { movie.SetMovieTake(v); }, [&](bool has) { movie.SetHasMovieTake(has); });
+    const auto take = IxmlOrKeyword(hasIxml && ixml.HasTake(), ixml.GetTake(), bext, hasBext, "TAKE");
+    if (take) movie.SetMovieTake(*take);
+    movie.SetHasMovieTake(take.has_value());
 }
 
 void AddShootDateFromMetadata(const BEXTChunk* bext, bool hasBext, ZEB::ZEBString path, Movie& movie) {

@@ -4,6 +4,7 @@ target_sources(OrloPlugin PRIVATE
     ${CMAKE_CURRENT_LIST_DIR}/AddTimeCodeFromMetadata.cpp
     ${CMAKE_CURRENT_LIST_DIR}/AudioMediaDescriptor.cpp
     ${CMAKE_CURRENT_LIST_DIR}/AudioTracks.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/FindBextKeyword.cpp
     ${CMAKE_CURRENT_LIST_DIR}/FrameRateSettings.cpp
     ${CMAKE_CURRENT_LIST_DIR}/FrameRateTable.cpp
     ${CMAKE_CURRENT_LIST_DIR}/GetFileCreationTime.cpp
