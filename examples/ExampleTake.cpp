@@ -65,7 +65,9 @@ std::string IxmlPayload(size_t padTo) {
         "    <AUDIO_BIT_DEPTH>24</AUDIO_BIT_DEPTH>\n"
         "    <DIGITIZER_SAMPLE_RATE>48000</DIGITIZER_SAMPLE_RATE>\n"
         "    <TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_HI>0</TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_HI>\n"
-        "    <TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_LO>" + start + "</TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_LO>\n"
+        "    <TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_LO>" +
+        start +
+        "</TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_LO>\n"
         "    <TIMESTAMP_SAMPLE_RATE>48000</TIMESTAMP_SAMPLE_RATE>\n"
         "  </SPEED>\n"
         "  <TRACK_LIST>\n"
@@ -87,7 +89,9 @@ std::string IxmlPayload(size_t padTo) {
         "    <BWF_ORIGINATOR>Orlo example</BWF_ORIGINATOR>\n"
         "    <BWF_ORIGINATION_DATE>2024-05-17</BWF_ORIGINATION_DATE>\n"
         "    <BWF_ORIGINATION_TIME>13:45:10</BWF_ORIGINATION_TIME>\n"
-        "    <BWF_TIME_REFERENCE_LOW>" + start + "</BWF_TIME_REFERENCE_LOW>\n"
+        "    <BWF_TIME_REFERENCE_LOW>" +
+        start +
+        "</BWF_TIME_REFERENCE_LOW>\n"
         "    <BWF_TIME_REFERENCE_HIGH>0</BWF_TIME_REFERENCE_HIGH>\n"
         "  </BEXT>\n"
         "</BWFXML>\n";

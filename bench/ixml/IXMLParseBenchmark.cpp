@@ -1,10 +1,9 @@
 // Parsing a typical iXML block of about 4 KB into IXMLData, as every file
 // with an iXML chunk costs on import.
 #include <benchmark/benchmark.h>
+#include <libxml/parser.h>
 
 #include <string>
-
-#include <libxml/parser.h>
 
 #include "TestHost.h"
 #include "reader/ParceRawIXML.h"
@@ -34,13 +33,14 @@ std::string TypicalIxml() {
         xml += "    <TRACK>\n      <CHANNEL_INDEX>" + n + "</CHANNEL_INDEX>\n      <INTERLEAVE_INDEX>" + n +
                "</INTERLEAVE_INDEX>\n      <NAME>Lav " + n + "</NAME>\n      <FUNCTION>NONE</FUNCTION>\n    </TRACK>\n";
     }
-    xml += "  </TRACK_LIST>\n  <HISTORY>\n    <ORIGINAL_FILENAME>42A_03.WAV</ORIGINAL_FILENAME>\n"
-           "    <PARENT_FILENAME>42A_03.WAV</PARENT_FILENAME>\n  </HISTORY>\n"
-           "  <FILE_SET>\n    <TOTAL_FILES>1</TOTAL_FILES>\n    <FAMILY_UID>RCD2024051713451000000001</FAMILY_UID>\n"
-           "    <FILE_SET_INDEX>A</FILE_SET_INDEX>\n  </FILE_SET>\n  <BEXT>\n"
-           "    <BWF_DESCRIPTION>sSCENE=42A sTAKE=3</BWF_DESCRIPTION>\n    <BWF_ORIGINATOR>Recorder</BWF_ORIGINATOR>\n"
-           "    <BWF_ORIGINATION_DATE>2024-05-17</BWF_ORIGINATION_DATE>\n"
-           "    <BWF_ORIGINATION_TIME>13:45:10</BWF_ORIGINATION_TIME>\n  </BEXT>\n";
+    xml +=
+        "  </TRACK_LIST>\n  <HISTORY>\n    <ORIGINAL_FILENAME>42A_03.WAV</ORIGINAL_FILENAME>\n"
+        "    <PARENT_FILENAME>42A_03.WAV</PARENT_FILENAME>\n  </HISTORY>\n"
+        "  <FILE_SET>\n    <TOTAL_FILES>1</TOTAL_FILES>\n    <FAMILY_UID>RCD2024051713451000000001</FAMILY_UID>\n"
+        "    <FILE_SET_INDEX>A</FILE_SET_INDEX>\n  </FILE_SET>\n  <BEXT>\n"
+        "    <BWF_DESCRIPTION>sSCENE=42A sTAKE=3</BWF_DESCRIPTION>\n    <BWF_ORIGINATOR>Recorder</BWF_ORIGINATOR>\n"
+        "    <BWF_ORIGINATION_DATE>2024-05-17</BWF_ORIGINATION_DATE>\n"
+        "    <BWF_ORIGINATION_TIME>13:45:10</BWF_ORIGINATION_TIME>\n  </BEXT>\n";
     // Recorders reserve room for later edits with a comment or filler.
     while (xml.size() < 4000) xml += "  <!-- reserved for later edits by the recorder -->\n";
     return xml + "</BWFXML>\n";

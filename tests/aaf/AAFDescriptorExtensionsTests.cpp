@@ -35,8 +35,8 @@ protected:
         Ptr<IAAFTypeDef> type;
         f.dictionary->LookupTypeDef(typeId, type.out());
         T out{};
-        EXPECT_EQ(Query<IAAFTypeDefRecord>(type.get())->GetStruct(value.get(), reinterpret_cast<aafMemPtr_t>(&out),
-                                                                    sizeof out),
+        EXPECT_EQ(Query<IAAFTypeDefRecord>(type.get())
+                      ->GetStruct(value.get(), reinterpret_cast<aafMemPtr_t>(&out), sizeof out),
                   AAFRESULT_SUCCESS);
         return out;
     }
@@ -146,8 +146,8 @@ TEST_F(AAFDescriptorExtensions, BoxesAreSetOnAPictureAndTheirTypeRegisteredOnce)
         const aafBoundsBox_t& expected;
     } boxes[] = {{kAAFPropID_EssenceBox, essence}, {kAAFPropID_SourceBox, source}, {kAAFPropID_ValidBox, valid}};
     for (const auto& box : boxes)
-        EXPECT_TRUE(SameBox(ReadRecord<aafBoundsBox_t>(picture.get(), kAAFClassID_DigitalImageDescriptor,
-                                                       box.property, kAAFTypeID_OrrinBoundsBox),
+        EXPECT_TRUE(SameBox(ReadRecord<aafBoundsBox_t>(picture.get(), kAAFClassID_DigitalImageDescriptor, box.property,
+                                                       kAAFTypeID_OrrinBoundsBox),
                             box.expected));
     Ptr<IAAFTypeDef> type;
     ASSERT_EQ(f.dictionary->LookupTypeDef(kAAFTypeID_OrrinBoundsBox, type.out()), AAFRESULT_SUCCESS);
@@ -165,7 +165,8 @@ TEST_F(AAFDescriptorExtensions, BufferFillOrderTakesKnownDirectionsOnly) {
         TOVRESULT result;
         aafInt64 stored;  // what the descriptor holds after the call
     } cases[] = {
-        {0, TOV_OK, 0}, {7, TOV_OK, 7}, {8, AAFRESULT_ILLEGAL_VALUE, 7}, {-1, AAFRESULT_ILLEGAL_VALUE, 7}, {2, TOV_OK, 2},
+        {0, TOV_OK, 0}, {7, TOV_OK, 7}, {8, AAFRESULT_ILLEGAL_VALUE, 7}, {-1, AAFRESULT_ILLEGAL_VALUE, 7},
+        {2, TOV_OK, 2},
     };
     Ptr<IAAFTypeDef> type;
     f.dictionary->LookupTypeDef(kAAFTypeID_ScanningDirectionType, type.out());
@@ -184,10 +185,10 @@ TEST_F(AAFDescriptorExtensions, ImageRotationLastValueStands) {
     ASSERT_TRUE(picture);
     for (const aafRational_t rotation : {aafRational_t{90, 1}, aafRational_t{-1, 2}}) {
         ASSERT_EQ(SetImageRotation(f.dictionary.get(), picture.get(), rotation), TOV_OK);
-        EXPECT_TRUE(SameRational(ReadRecord<aafRational_t>(picture.get(), kAAFClassID_DigitalImageDescriptor,
-                                                           kAAFPropID_DigitalImageDescriptor_ImageRotation,
-                                                           kAAFTypeID_Rational),
-                                 rotation));
+        EXPECT_TRUE(SameRational(
+            ReadRecord<aafRational_t>(picture.get(), kAAFClassID_DigitalImageDescriptor,
+                                      kAAFPropID_DigitalImageDescriptor_ImageRotation, kAAFTypeID_Rational),
+            rotation));
     }
     EXPECT_EQ(SetImageRotation(f.dictionary.get(), nullptr, {90, 1}), TOV_E_POINTER);
 }

@@ -20,9 +20,9 @@ bool Same(const _aafRational_t& a, const _aafRational_t& b) {
     const _aafRational_t* want[] = {&expected.PositionX, &expected.PositionY, &expected.Width, &expected.Height};
     for (int i = 0; i < 4; ++i)
         if (!Same(*got[i], *want[i]))
-            return ::testing::AssertionFailure() << "member " << i << " is " << got[i]->numerator << "/"
-                                                 << got[i]->denominator << ", expected " << want[i]->numerator
-                                                 << "/" << want[i]->denominator;
+            return ::testing::AssertionFailure()
+                   << "member " << i << " is " << got[i]->numerator << "/" << got[i]->denominator << ", expected "
+                   << want[i]->numerator << "/" << want[i]->denominator;
     return ::testing::AssertionSuccess();
 }
 
@@ -30,16 +30,21 @@ TEST(AAFImageGeometry, ReduceRational) {
     struct Case {
         _aafRational_t in, out;
     } cases[] = {
-        {{1920, 1080}, {16, 9}},       {{0, 25}, {0, 1}},          {{3, -6}, {-1, 2}},
-        {{-4, -8}, {1, 2}},            {{7, 0}, {7, 0}},           {{0, 0}, {0, 0}},
-        {{INT_MIN, -2}, {1073741824, 1}}, {{INT_MIN, -1}, {INT_MIN, -1}},  // the sign cannot move
+        {{1920, 1080}, {16, 9}},
+        {{0, 25}, {0, 1}},
+        {{3, -6}, {-1, 2}},
+        {{-4, -8}, {1, 2}},
+        {{7, 0}, {7, 0}},
+        {{0, 0}, {0, 0}},
+        {{INT_MIN, -2}, {1073741824, 1}},
+        {{INT_MIN, -1}, {INT_MIN, -1}},  // the sign cannot move
         {{30000, 1001}, {30000, 1001}},
     };
     for (const Case& c : cases) {
         _aafRational_t r = c.in;
         ReduceRational(r);
-        EXPECT_TRUE(Same(r, c.out)) << c.in.numerator << "/" << c.in.denominator << " gave " << r.numerator
-                                    << "/" << r.denominator;
+        EXPECT_TRUE(Same(r, c.out)) << c.in.numerator << "/" << c.in.denominator << " gave " << r.numerator << "/"
+                                    << r.denominator;
     }
 }
 
@@ -48,20 +53,20 @@ TEST(AAFImageGeometry, IsSDorHD) {
         _aafRational_t width, height;
         bool expected;
     } cases[] = {
-        {{1920, 1}, {1080, 1}, true},   // the limits themselves pass
-        {{3840, 2}, {2160, 2}, true},   // so do they unreduced
-        {{1280, 1}, {720, 1}, true},    {{640, 1}, {480, 1}, true},
-        {{1440, 1}, {1080, 1}, true},   // 4:3 at full height
-        {{1921, 1}, {1080, 1}, false},  {{3841, 2}, {1080, 1}, false},  // 1920.5 is too wide
-        {{1920, 1}, {2161, 2}, false},  {{2048, 1}, {1152, 1}, false},  // 16:9 but too large
-        {{3839, 2}, {2159, 2}, false},  // within the limits, a shape of 3839:2159
-        {{720, 1}, {480, 1}, false},    {{720, 1}, {576, 1}, false},    {{1920, 1}, {1200, 1}, false},
-        {{16, 0}, {9, 1}, false},       {{16, 1}, {9, 0}, false},       {{16, 1}, {0, 1}, false},
+        {{1920, 1}, {1080, 1}, true},  // the limits themselves pass
+        {{3840, 2}, {2160, 2}, true},  // so do they unreduced
+        {{1280, 1}, {720, 1}, true},   {{640, 1}, {480, 1}, true},
+        {{1440, 1}, {1080, 1}, true},                                  // 4:3 at full height
+        {{1921, 1}, {1080, 1}, false}, {{3841, 2}, {1080, 1}, false},  // 1920.5 is too wide
+        {{1920, 1}, {2161, 2}, false}, {{2048, 1}, {1152, 1}, false},  // 16:9 but too large
+        {{3839, 2}, {2159, 2}, false},                                 // within the limits, a shape of 3839:2159
+        {{720, 1}, {480, 1}, false},   {{720, 1}, {576, 1}, false},
+        {{1920, 1}, {1200, 1}, false}, {{16, 0}, {9, 1}, false},
+        {{16, 1}, {9, 0}, false},      {{16, 1}, {0, 1}, false},
     };
     for (const Case& c : cases)
-        EXPECT_EQ(IsSDorHD(c.width, c.height), c.expected)
-            << c.width.numerator << "/" << c.width.denominator << " x " << c.height.numerator << "/"
-            << c.height.denominator;
+        EXPECT_EQ(IsSDorHD(c.width, c.height), c.expected) << c.width.numerator << "/" << c.width.denominator << " x "
+                                                           << c.height.numerator << "/" << c.height.denominator;
 }
 
 TEST(AAFImageGeometry, GetWorldDimensions) {
@@ -101,8 +106,7 @@ class DefaultBoxes : public ::testing::TestWithParam<BoxCase> {};
 TEST_P(DefaultBoxes, AreCentredInTheWorldFrame) {
     const BoxCase& c = GetParam();
     aafBoundsBox_t e{}, s{}, v{};
-    ASSERT_EQ(CalculateDefaultOrrinBoxes(c.essence, c.source, c.valid, c.imageAspect, c.pixelAspect, e, s, v),
-              TOV_OK);
+    ASSERT_EQ(CalculateDefaultOrrinBoxes(c.essence, c.source, c.valid, c.imageAspect, c.pixelAspect, e, s, v), TOV_OK);
     EXPECT_TRUE(SameBox(e, c.essenceBox));
     EXPECT_TRUE(SameBox(s, c.sourceBox));
     EXPECT_TRUE(SameBox(v, c.validBox));
@@ -113,31 +117,55 @@ const Rectangle kPAL{{720, 1}, {576, 1}};
 
 INSTANTIATE_TEST_SUITE_P(
     Frames, DefaultBoxes,
-    ::testing::Values(
-        BoxCase{"HDSquarePixels", kHD, kHD, {{1900, 1}, {1060, 1}}, {0, 0}, {1, 1},
-                {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
-                {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
-                {{10, 1}, {10, 1}, {1900, 1}, {1060, 1}}},
-        // Without a pixel aspect ratio, 16:9 over the HD frame gives square pixels again.
-        BoxCase{"HDFromTheImageAspect", kHD, kHD, {{1901, 1}, {1080, 1}}, {32, 18}, {0, 1},
-                {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
-                {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
-                {{19, 2}, {0, 1}, {1901, 1}, {1080, 1}}},
-        // 720 x 576 is scaled to 600 x 480 and widened to 4:3 by the pixels' 16/15.
-        BoxCase{"PALFromTheImageAspect", kPAL, {{1440, 2}, {576, 1}}, {{702, 1}, {576, 1}}, {4, 3}, {0, 0},
-                {{0, 1}, {0, 1}, {640, 1}, {480, 1}},
-                {{0, 1}, {0, 1}, {640, 1}, {480, 1}},
-                {{8, 1}, {0, 1}, {624, 1}, {480, 1}}},
-        // A positive pixel aspect ratio wins over the image aspect ratio.
-        BoxCase{"PixelAspectWins", kPAL, kPAL, kPAL, {16, 9}, {12, 10},
-                {{0, 1}, {0, 1}, {720, 1}, {480, 1}},
-                {{0, 1}, {0, 1}, {720, 1}, {480, 1}},
-                {{0, 1}, {0, 1}, {720, 1}, {480, 1}}},
-        // A source larger than the essence lies at a negative position.
-        BoxCase{"LargerSource", kHD, {{2000, 1}, {1100, 1}}, kHD, {16, 9}, {1, 1},
-                {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
-                {{-40, 1}, {-10, 1}, {2000, 1}, {1100, 1}},
-                {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}}}),
+    ::testing::Values(BoxCase{"HDSquarePixels",
+                              kHD,
+                              kHD,
+                              {{1900, 1}, {1060, 1}},
+                              {0, 0},
+                              {1, 1},
+                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
+                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
+                              {{10, 1}, {10, 1}, {1900, 1}, {1060, 1}}},
+                      // Without a pixel aspect ratio, 16:9 over the HD frame gives square pixels again.
+                      BoxCase{"HDFromTheImageAspect",
+                              kHD,
+                              kHD,
+                              {{1901, 1}, {1080, 1}},
+                              {32, 18},
+                              {0, 1},
+                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
+                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
+                              {{19, 2}, {0, 1}, {1901, 1}, {1080, 1}}},
+                      // 720 x 576 is scaled to 600 x 480 and widened to 4:3 by the pixels' 16/15.
+                      BoxCase{"PALFromTheImageAspect",
+                              kPAL,
+                              {{1440, 2}, {576, 1}},
+                              {{702, 1}, {576, 1}},
+                              {4, 3},
+                              {0, 0},
+                              {{0, 1}, {0, 1}, {640, 1}, {480, 1}},
+                              {{0, 1}, {0, 1}, {640, 1}, {480, 1}},
+                              {{8, 1}, {0, 1}, {624, 1}, {480, 1}}},
+                      // A positive pixel aspect ratio wins over the image aspect ratio.
+                      BoxCase{"PixelAspectWins",
+                              kPAL,
+                              kPAL,
+                              kPAL,
+                              {16, 9},
+                              {12, 10},
+                              {{0, 1}, {0, 1}, {720, 1}, {480, 1}},
+                              {{0, 1}, {0, 1}, {720, 1}, {480, 1}},
+                              {{0, 1}, {0, 1}, {720, 1}, {480, 1}}},
+                      // A source larger than the essence lies at a negative position.
+                      BoxCase{"LargerSource",
+                              kHD,
+                              {{2000, 1}, {1100, 1}},
+                              kHD,
+                              {16, 9},
+                              {1, 1},
+                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
+                              {{-40, 1}, {-10, 1}, {2000, 1}, {1100, 1}},
+                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}}}),
     [](const auto& info) { return std::string(info.param.name); });
 
 TEST(AAFImageGeometry, DefaultBoxesRefuseWhatCannotBeWorkedOut) {

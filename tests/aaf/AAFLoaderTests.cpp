@@ -131,7 +131,8 @@ TEST(AAFLoaderPlatform, NullArguments) {
     EXPECT_EQ(AAFLoadLibrary("x", nullptr), AAFRESULT_NULL_PARAM);
     EXPECT_EQ(AAFUnloadLibrary(nullptr), AAFRESULT_NULL_PARAM);
     EXPECT_EQ(AAFFindSymbol(nullptr, "x", &symbol), AAFRESULT_NULL_PARAM);
-    EXPECT_EQ(AAFFindLibrary(nullptr, [](const char*, const char*, char, void*) { return 0; }, nullptr),
+    EXPECT_EQ(AAFFindLibrary(
+                  nullptr, [](const char*, const char*, char, void*) { return 0; }, nullptr),
               AAFRESULT_NULL_PARAM);
     EXPECT_EQ(AAFFindLibrary("/", nullptr, nullptr), AAFRESULT_NULL_PARAM);
 }

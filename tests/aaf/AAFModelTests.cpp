@@ -248,8 +248,7 @@ TEST_F(AAFModel, AttributesAppendThroughAnOptionalStrongReferenceVector) {
     f.dictionary->LookupTypeDef(kAAFTypeID_TaggedValueStrongReference, refType.out());
     f.dictionary->LookupTypeDef(kAAFTypeID_TaggedValueStrongReferenceVector, vectorType.out());
     Ptr<IAAFPropertyValue> element;
-    ASSERT_EQ(Query<IAAFTypeDefObjectRef>(refType.get())->CreateValue(tagged.get(), element.out()),
-              AAFRESULT_SUCCESS);
+    ASSERT_EQ(Query<IAAFTypeDefObjectRef>(refType.get())->CreateValue(tagged.get(), element.out()), AAFRESULT_SUCCESS);
     Ptr<IAAFClassDef> mobClass;
     f.dictionary->LookupClassDef(kAAFClassID_Mob, mobClass.out());
     Ptr<IAAFPropertyDef> attributes;
@@ -324,7 +323,9 @@ TEST_F(AAFModel, TaggedValueBytesOfAnySizeIncludingNone) {
         aafUInt32 size;
         AAFRESULT result;
     } cases[] = {
-        {nullptr, 0, AAFRESULT_SUCCESS}, {data, 0, AAFRESULT_SUCCESS}, {data, 3, AAFRESULT_SUCCESS},
+        {nullptr, 0, AAFRESULT_SUCCESS},
+        {data, 0, AAFRESULT_SUCCESS},
+        {data, 3, AAFRESULT_SUCCESS},
         {nullptr, 3, AAFRESULT_NULL_PARAM},
     };
     for (const auto& c : cases) {

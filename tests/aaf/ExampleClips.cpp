@@ -31,7 +31,7 @@ constexpr aafLength_t kSamples = 480000;
 constexpr aafPosition_t kStartOffset = 900000;  // 10:00:00:00 at 25 frames
 
 aafMobID_t BaseMobID() {
-    aafMobID_t id{{0x06, 0x0A, 0x2B, 0x34, 0x01, 0x01, 0x01, 0x05, 0x01, 0x01, 0x0F, 0x20}, 0x13, 0x00, 0x00, 0x00,
+    aafMobID_t id{{0x06, 0x0A, 0x2B, 0x34, 0x01, 0x01, 0x01, 0x05, 0x01, 0x01, 0x0F, 0x20},      0x13, 0x00, 0x00, 0x00,
                   {0x4F524C4F, 0x0001, 0x0002, {0x10, 0x20, 0x30, 0x40, 0x50, 0x60, 0x70, 0x80}}};
     return id;
 }
@@ -48,9 +48,9 @@ aafProductIdentification_t* Identification() {
     static aafCharacter product[] = L"Orlo Plug-In";
     static aafCharacter versionText[] = L"1.9.1.10178";
     static aafCharacter platform[] = L"MacOS X";
-    static aafProductIdentification_t ident{company, product, versionText,
-                                            {0x3711D3CC, 0x62D0, 0x49D7, {0xB0, 0xAE, 0xC1, 0x18, 0x10, 0x1D, 0x1A, 0x16}},
-                                            platform, &version};
+    static aafProductIdentification_t ident{
+        company,  product, versionText, {0x3711D3CC, 0x62D0, 0x49D7, {0xB0, 0xAE, 0xC1, 0x18, 0x10, 0x1D, 0x1A, 0x16}},
+        platform, &version};
     return &ident;
 }
 
@@ -119,8 +119,8 @@ public:
         return Query<IAAFSourceReference2>(Query<IAAFSourceClip>(segment.get()).get());
     }
 
-    void AddNilTapeSlot(IAAFSourceMob* tape, IAAFMob* tapeMob, aafSlotID_t id, aafUInt32 physical,
-                        const wchar_t* name, aafLength_t length) {
+    void AddNilTapeSlot(IAAFSourceMob* tape, IAAFMob* tapeMob, aafSlotID_t id, aafUInt32 physical, const wchar_t* name,
+                        aafLength_t length) {
         const double padding = std::ceil(kMovieRate.numerator * 172800.0 / kMovieRate.denominator);
         const aafLength_t padded = length < padding ? length + static_cast<aafLength_t>(padding) : length;
         Must(tape->AddNilReference(id, padded, sound.get(), kMovieRate), "AddNilReference");
@@ -243,8 +243,8 @@ IAAFFile* BuildGroupedClip(const std::vector<aafUInt32>& channels) {
             const aafSlotID_t s = base + n + 1;
             if (n == c - base) {
                 aafSourceRef_t toFile{WithByte13(static_cast<aafUInt8>(0xB1 + i)), base + 1, 0};
-                Must(master.master->NewPhysSourceRef(kMovieRate, base + 1 + static_cast<aafSlotID_t>(i),
-                                                     b.sound.get(), toFile, groupLength),
+                Must(master.master->NewPhysSourceRef(kMovieRate, base + 1 + static_cast<aafSlotID_t>(i), b.sound.get(),
+                                                     toFile, groupLength),
                      "NewPhysSourceRef");
                 b.FinishSlot(master.mob.get(), base + 1 + static_cast<aafSlotID_t>(i), c, name);
                 aafSourceRef_t toTape{WithByte13(0xA1), s, kStartOffset};
@@ -252,8 +252,8 @@ IAAFFile* BuildGroupedClip(const std::vector<aafUInt32>& channels) {
                      "NewPhysSourceRef");
                 b.FinishSlot(files[i].mob.get(), base + 1, c, name);
                 auto essence = Query<IAAFEssenceDescriptor>(pcm.get());
-                Must(ZEB::AAFUtils::SetMediaAccessKind(b.f.dictionary.get(),
-                                                       Query<IAAFFileDescriptor>(pcm.get()).get(), 3),
+                Must(ZEB::AAFUtils::SetMediaAccessKind(b.f.dictionary.get(), Query<IAAFFileDescriptor>(pcm.get()).get(),
+                                                       3),
                      "SetMediaAccessKind");
                 std::wstring url = L"file:///media/day1/Group_" + std::to_wstring(c) + L".wav";
                 b.AddLocator(essence.get(), url.c_str());
@@ -361,14 +361,12 @@ IAAFFile* BuildMetadataClip() {
     for (aafUInt32 track = 1; track <= 2; ++track) {
         const aafSlotID_t slot = track + timecodeSlots;
         aafSourceRef_t toSfile{sfileID, slot, position};
-        Must(source.source->NewPhysSourceRef(sampleRate, track, b.sound.get(), toSfile, kSamples),
-             "NewPhysSourceRef");
+        Must(source.source->NewPhysSourceRef(sampleRate, track, b.sound.get(), toSfile, kSamples), "NewPhysSourceRef");
         wchar_t name[12];
         std::swprintf(name, 12, L"A%d", track);
         aafNumSlots_t count = 0;
         Must(master.mob->CountSlots(&count), "CountSlots");
-        Must(master.master->AddMasterSlot(b.sound.get(), track, source.source.get(), count + 1, name),
-             "AddMasterSlot");
+        Must(master.master->AddMasterSlot(b.sound.get(), track, source.source.get(), count + 1, name), "AddMasterSlot");
         const double padding = std::ceil(kMovieRate.numerator * 172800.0 / kMovieRate.denominator);
         const aafLength_t length = kSamples + (kSamples < padding ? static_cast<aafLength_t>(padding) : 0);
         Must(sfile.source->AddNilReference(slot, length, b.sound.get(), sampleRate), "AddNilReference");

@@ -25,12 +25,13 @@ TempFile::~TempFile() { unlink(m_Path.c_str()); }
 void TempFile::WriteAt(uint64_t offset, const std::string& bytes) {
     const int fd = open(m_Path.c_str(), O_WRONLY);
     if (fd < 0) throw std::runtime_error("cannot open a temporary file");
-    const bool written = pwrite(fd, bytes.data(), bytes.size(), static_cast<off_t>(offset)) ==
-                         static_cast<ssize_t>(bytes.size());
+    const bool written =
+        pwrite(fd, bytes.data(), bytes.size(), static_cast<off_t>(offset)) == static_cast<ssize_t>(bytes.size());
     close(fd);
     if (!written) throw std::runtime_error("cannot write a temporary file");
 }
 
 void TempFile::Resize(uint64_t size) {
-    if (truncate(m_Path.c_str(), static_cast<off_t>(size)) != 0) throw std::runtime_error("cannot resize a temporary file");
+    if (truncate(m_Path.c_str(), static_cast<off_t>(size)) != 0)
+        throw std::runtime_error("cannot resize a temporary file");
 }

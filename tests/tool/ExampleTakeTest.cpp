@@ -18,8 +18,7 @@ std::string Committed() {
 TEST(ExampleTakeTest, CommittedFileIsWhatTheGeneratorWrites) {
     const std::string committed = Committed();
     ASSERT_FALSE(committed.empty()) << "examples/" << ExampleTake::kFileName << " is missing";
-    EXPECT_TRUE(committed == ExampleTake::File())
-        << "regenerate it: make_example_take " << ORLO_EXAMPLES_DIR;
+    EXPECT_TRUE(committed == ExampleTake::File()) << "regenerate it: make_example_take " << ORLO_EXAMPLES_DIR;
     EXPECT_LT(committed.size(), 400u * 1024);
 }
 

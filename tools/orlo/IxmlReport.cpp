@@ -28,7 +28,7 @@ Json Speed(const IXMLData& data) {
     const IXMLSpeed speed = data.GetSpeed();
     const _aafRational_t rate = speed.GetTimeCodeRate();
     return {{"timecodeRate", JsonMaybe(speed.HasTimeCodeRate(),
-                                   std::to_string(rate.numerator) + "/" + std::to_string(rate.denominator))},
+                                       std::to_string(rate.numerator) + "/" + std::to_string(rate.denominator))},
             {"timecodeDrop", JsonMaybe(speed.HasTimeCodeFlag(), speed.GetTimeCodeFlag())},
             {"timestampSampleRate", JsonMaybe(speed.HasTimeStampSampleRate(), speed.GetTimeStampSampleRate())},
             {"samplesSinceMidnight", JsonMaybe(speed.HasSamplesSinceMidnight(), speed.GetSamplesSinceMidnight())},

@@ -37,14 +37,10 @@ Json Trks(const HelperFunctions::TrkMap& trks) {
 }
 
 Json Descriptor(const AudioMediaDescriptor& descriptor) {
-    return {{"sampleRate", descriptor.GetSampleRate()},
-            {"bytesPerFrame", descriptor.GetBytesPerFrame()},
-            {"bytesPerPacket", descriptor.GetBytesPerPacket()},
-            {"channelsPerFrame", descriptor.GetChannelsPerFrame()},
-            {"bitsPerChannel", descriptor.GetBitsPerChannel()},
-            {"bigEndian", descriptor.IsBigEndian()},
-            {"floatingPoint", descriptor.IsFloatingPoint()},
-            {"startOffset", descriptor.GetStartOffset()}};
+    return {{"sampleRate", descriptor.GetSampleRate()},         {"bytesPerFrame", descriptor.GetBytesPerFrame()},
+            {"bytesPerPacket", descriptor.GetBytesPerPacket()}, {"channelsPerFrame", descriptor.GetChannelsPerFrame()},
+            {"bitsPerChannel", descriptor.GetBitsPerChannel()}, {"bigEndian", descriptor.IsBigEndian()},
+            {"floatingPoint", descriptor.IsFloatingPoint()},    {"startOffset", descriptor.GetStartOffset()}};
 }
 
 Json Tracks(const Movie& movie) {

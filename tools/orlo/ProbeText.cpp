@@ -92,7 +92,8 @@ void PrintTable(const std::vector<std::vector<std::string>>& rows) {
 // One row per track; audio columns are "-" for the timecode track, and the
 // path column appears only when a track lies in a file of its own.
 void PrintTracks(const Json& tracks) {
-    const bool paths = std::any_of(tracks.begin(), tracks.end(), [](const Json& t) { return !t["path"].get<std::string>().empty(); });
+    const bool paths =
+        std::any_of(tracks.begin(), tracks.end(), [](const Json& t) { return !t["path"].get<std::string>().empty(); });
     std::vector<std::vector<std::string>> rows = {
         {"#", "type", "channel", "bytes", "samples", "rate", "bits", "of", "frame", "offset", "order", "float"}};
     if (paths) rows[0].push_back("path");

@@ -19,9 +19,8 @@ std::string KnownPaths() {
 
 // Decimal digits only: a sign, blanks or a base prefix would hide typing errors.
 bool ParseValue(const std::string& text, uint32_t& value) {
-    if (text.empty() || text.size() > 10 || !std::all_of(text.begin(), text.end(), [](char c) {
-            return c >= '0' && c <= '9';
-        }))
+    if (text.empty() || text.size() > 10 ||
+        !std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; }))
         return false;
     const unsigned long long number = std::stoull(text);
     if (number > UINT32_MAX) return false;

@@ -17,9 +17,9 @@ TOVRESULT ComponentRegistry::Add(ITOVComponentDefinition* definition, CTOVClassF
 }
 
 void ComponentRegistry::RemoveModule(const PluginModule* module) {
-    m_Entries.erase(std::remove_if(m_Entries.begin(), m_Entries.end(),
-                                   [module](const Entry& e) { return e.module == module; }),
-                    m_Entries.end());
+    m_Entries.erase(
+        std::remove_if(m_Entries.begin(), m_Entries.end(), [module](const Entry& e) { return e.module == module; }),
+        m_Entries.end());
 }
 
 const ComponentRegistry::Entry* ComponentRegistry::FindComponent(const _tovUID& compID) const {

@@ -16,8 +16,7 @@ TOVRESULT DefinitionAttributes::Set(const _tovUID& attribute, const _tovUID& typ
     return TOV_OK;
 }
 
-TOVRESULT DefinitionAttributes::Get(const _tovUID& attribute, const _tovUID& type, void* out,
-                                    unsigned int size) const {
+TOVRESULT DefinitionAttributes::Get(const _tovUID& attribute, const _tovUID& type, void* out, unsigned int size) const {
     const auto found = m_Values.find(attribute);
     if (found == m_Values.end()) return ZEB_E_NOTFOUND;
     const Value& value = found->second;

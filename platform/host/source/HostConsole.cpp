@@ -1,9 +1,10 @@
 #include "tov/host/HostConsole.h"
 
+#include <locale.h>
+
 #include <clocale>
 #include <cstdio>
 #include <cwchar>
-#include <locale.h>
 #include <vector>
 
 #include "tov/host/UTF8Locale.h"

@@ -7,8 +7,7 @@ TOVRESULT HostXmlDomNodeList::Create(const HostXmlDocumentRef& document, std::ve
                                      UTIL::ITOVXmlDomNodeList** out) {
     return TOVGuarded([&] {
         TOVPtr<UTIL::ITOVXmlDomNodeList> list;
-        TOVCheck(TOVCreateComponent<HostXmlDomNodeList>(nullptr, nullptr, UTIL::IID_ITOVXmlDomNodeList,
-                                                        list.Out()));
+        TOVCheck(TOVCreateComponent<HostXmlDomNodeList>(nullptr, nullptr, UTIL::IID_ITOVXmlDomNodeList, list.Out()));
         auto* self = static_cast<HostXmlDomNodeList*>(list.Get());
         self->m_Document = document;
         self->m_Nodes = std::move(nodes);

@@ -128,7 +128,8 @@ TOVRESULT HostXmlNodeBase<Interface, ViewIID>::GetAttributes(UTIL::ITOVXmlDomNod
         if (!out) return TOV_E_INVALIDARG;
         std::vector<xmlNodePtr> attributes;
         if (m_Node->type == XML_ELEMENT_NODE)
-            for (xmlAttrPtr a = m_Node->properties; a; a = a->next) attributes.push_back(reinterpret_cast<xmlNodePtr>(a));
+            for (xmlAttrPtr a = m_Node->properties; a; a = a->next)
+                attributes.push_back(reinterpret_cast<xmlNodePtr>(a));
         return HostXmlDomNodeList::Create(m_Document, std::move(attributes), out);
     });
 }

@@ -111,9 +111,8 @@ void HostXmlSaxParser::OnEndDocument(void* self) {
     parser->Deliver([&] { return parser->m_DocumentHandler->End(); });
 }
 
-void HostXmlSaxParser::OnStartElement(void* self, const xmlChar* localName, const xmlChar* prefix, const xmlChar*,
-                                      int, const xmlChar**, int attributeCount, int,
-                                      const xmlChar** attributes) {
+void HostXmlSaxParser::OnStartElement(void* self, const xmlChar* localName, const xmlChar* prefix, const xmlChar*, int,
+                                      const xmlChar**, int attributeCount, int, const xmlChar** attributes) {
     auto* parser = static_cast<HostXmlSaxParser*>(self);
     if (++parser->m_Depth > LibXmlSafety::kMaxDepth && parser->m_HandlerResult >= 0) {
         parser->m_HandlerResult = TOV_E_FAIL;
@@ -152,8 +151,7 @@ void HostXmlSaxParser::OnCharacters(void* self, const xmlChar* text, int length)
     });
 }
 
-void HostXmlSaxParser::OnEntityDeclaration(void* self, const xmlChar*, int, const xmlChar*, const xmlChar*,
-                                           xmlChar*) {
+void HostXmlSaxParser::OnEntityDeclaration(void* self, const xmlChar*, int, const xmlChar*, const xmlChar*, xmlChar*) {
     LibXmlSafety::StopAtEntity(static_cast<HostXmlSaxParser*>(self)->m_Context);
 }
 

@@ -24,8 +24,8 @@ TOVPtr<TOVHost> TOVHost::Create() {
     host->InternalAddRef();
     TOVCheck(host->RegisterBuiltin(TOVCompID_PluginDefinition, CLSID_HostPluginDefinition, L"PluginDefinition",
                                    HostPluginDefinition::TOVCreate));
-    TOVCheck(host->RegisterBuiltin(TOVCompID_ComponentDefinition, CLSID_HostComponentDefinition,
-                                   L"ComponentDefinition", HostComponentDefinition::TOVCreate));
+    TOVCheck(host->RegisterBuiltin(TOVCompID_ComponentDefinition, CLSID_HostComponentDefinition, L"ComponentDefinition",
+                                   HostComponentDefinition::TOVCreate));
     TOVCheck(host->RegisterBuiltin(TOVCompID_TOVString, CLSID_HostString, L"TOVString", HostString::TOVCreate));
     TOVCheck(host->RegisterBuiltin(UTIL::CompID_TOVXmlReader, CLSID_HostXmlParser, L"TOVXmlReader",
                                    HostXmlParser::TOVCreate));
@@ -33,10 +33,9 @@ TOVPtr<TOVHost> TOVHost::Create() {
                                    HostXmlSaxParser::TOVCreate));
     TOVCheck(host->RegisterBuiltin(UTIL::CompID_TOVXmlWriter, CLSID_HostXmlWriter, L"TOVXmlWriter",
                                    HostXmlWriter::TOVCreate));
-    TOVCheck(host->RegisterBuiltin(TOVCompID_FTFManager, CLSID_HostFTFManager, L"FTFManager",
-                                   HostFTFManager::TOVCreate));
-    TOVCheck(host->RegisterBuiltin(CompID_HostSettings, CLSID_HostSettings, L"HostSettings",
-                                   HostSettings::TOVCreate));
+    TOVCheck(
+        host->RegisterBuiltin(TOVCompID_FTFManager, CLSID_HostFTFManager, L"FTFManager", HostFTFManager::TOVCreate));
+    TOVCheck(host->RegisterBuiltin(CompID_HostSettings, CLSID_HostSettings, L"HostSettings", HostSettings::TOVCreate));
     TOVCheck(host->RegisterBuiltin(TOVCompID_UIDGenerator, CLSID_HostUIDGeneratorMD5, L"UIDGeneratorMD5",
                                    HostUIDGeneratorMD5::TOVCreate));
     return host;
@@ -52,8 +51,8 @@ TOVRESULT TOVHost::RegisterBuiltin(const _tovUID& compID, const _tovUID& clsid, 
                                    CTOVClassFactory::Creator creator) {
     return TOVGuarded([&] {
         TOVPtr<ITOVComponentDefinition> definition;
-        TOVCheck(HostComponentDefinition::TOVCreate(AsUnknown(), nullptr, IID_ITOVComponentDefinition,
-                                                    definition.Out()));
+        TOVCheck(
+            HostComponentDefinition::TOVCreate(AsUnknown(), nullptr, IID_ITOVComponentDefinition, definition.Out()));
         TOVCheck(definition->Initialize(compID, TOVCompType_HostService, 1, 0, clsid, name));
         return m_Registry.Add(definition.Get(), creator, nullptr);
     });

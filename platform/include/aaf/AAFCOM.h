@@ -21,9 +21,9 @@ protected:
 template <class Interface>
 struct AAFInterfaceID;
 
-#define AAF_INTERFACE_ID(Interface)                             \
-    template <>                                                 \
-    struct AAFInterfaceID<Interface> {                          \
+#define AAF_INTERFACE_ID(Interface)                               \
+    template <>                                                   \
+    struct AAFInterfaceID<Interface> {                            \
         static constexpr const aafUID_t& value = IID_##Interface; \
     }
 

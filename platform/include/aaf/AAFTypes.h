@@ -228,9 +228,7 @@ typedef _aafElectroSpatialFormulation_e aafElectroSpatialFormulation_t;
 
 /// Tape form factors are not written by this system; the other published
 /// values (1 to 7) pass through as numbers.
-enum _aafTapeCaseType_e : aafInt32 {
-    kAAFTapeCaseNull = 0
-};
+enum _aafTapeCaseType_e : aafInt32 { kAAFTapeCaseNull = 0 };
 typedef _aafTapeCaseType_e aafTapeCaseType_t;
 
 enum _aafVideoSignalType_e : aafInt32 {

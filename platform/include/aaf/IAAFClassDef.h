@@ -5,11 +5,15 @@
 
 class IAAFClassDef : public IUnknown {
 public:
-    virtual AAFRESULT Initialize(aafUID_constref classID, IAAFClassDef* pParentClass, aafCharacter_constptr pClassName, aafBool isConcrete) = 0;
+    virtual AAFRESULT Initialize(aafUID_constref classID, IAAFClassDef* pParentClass, aafCharacter_constptr pClassName,
+                                 aafBool isConcrete) = 0;
     virtual AAFRESULT GetPropertyDefs(IEnumAAFPropertyDefs** ppEnum) = 0;
     virtual AAFRESULT CountPropertyDefs(aafUInt32* pCount) = 0;
-    virtual AAFRESULT RegisterNewPropertyDef(aafUID_constref id, aafCharacter_constptr pName, IAAFTypeDef* pTypeDef, aafBool isOptional, aafBool isUniqueIdentifier, IAAFPropertyDef** ppPropDef) = 0;
-    virtual AAFRESULT RegisterOptionalPropertyDef(aafUID_constref id, aafCharacter_constptr pName, IAAFTypeDef* pTypeDef, IAAFPropertyDef** ppPropDef) = 0;
+    virtual AAFRESULT RegisterNewPropertyDef(aafUID_constref id, aafCharacter_constptr pName, IAAFTypeDef* pTypeDef,
+                                             aafBool isOptional, aafBool isUniqueIdentifier,
+                                             IAAFPropertyDef** ppPropDef) = 0;
+    virtual AAFRESULT RegisterOptionalPropertyDef(aafUID_constref id, aafCharacter_constptr pName,
+                                                  IAAFTypeDef* pTypeDef, IAAFPropertyDef** ppPropDef) = 0;
     virtual AAFRESULT LookupPropertyDef(aafUID_constref propID, IAAFPropertyDef** ppPropDef) = 0;
     virtual AAFRESULT GetName(aafCharacter* pName, aafUInt32 bufSize) = 0;
     virtual AAFRESULT GetNameBufLen(aafUInt32* pBufSize) = 0;

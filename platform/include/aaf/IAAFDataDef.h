@@ -5,7 +5,8 @@
 
 class IAAFDataDef : public IUnknown {
 public:
-    virtual AAFRESULT Initialize(aafUID_constref id, aafCharacter_constptr pName, aafCharacter_constptr pDescription) = 0;
+    virtual AAFRESULT Initialize(aafUID_constref id, aafCharacter_constptr pName,
+                                 aafCharacter_constptr pDescription) = 0;
     virtual AAFRESULT IsPictureKind(aafBool* bIsPictureKind) = 0;
     virtual AAFRESULT IsMatteKind(aafBool* bIsMatteKind) = 0;
     virtual AAFRESULT IsPictureWithMatteKind(aafBool* bIsPictureWithMatteKind) = 0;

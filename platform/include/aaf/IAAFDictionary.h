@@ -43,7 +43,8 @@ public:
     virtual AAFRESULT GetContainerDefs(IEnumAAFContainerDefs** ppEnum) = 0;
     virtual AAFRESULT CountContainerDefs(aafUInt32* pResult) = 0;
     virtual AAFRESULT RegisterInterpolationDef(IAAFInterpolationDef* pInterpolationDef) = 0;
-    virtual AAFRESULT LookupInterpolationDef(aafUID_constref parameterId, IAAFInterpolationDef** ppInterpolationDef) = 0;
+    virtual AAFRESULT LookupInterpolationDef(aafUID_constref parameterId,
+                                             IAAFInterpolationDef** ppInterpolationDef) = 0;
     virtual AAFRESULT GetInterpolationDefs(IEnumAAFInterpolationDefs** ppEnum) = 0;
     virtual AAFRESULT CountInterpolationDefs(aafUInt32* pResult) = 0;
     virtual AAFRESULT RegisterPluginDef(IAAFPluginDef* pPlugDef) = 0;

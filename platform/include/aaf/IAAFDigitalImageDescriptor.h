@@ -9,10 +9,14 @@ public:
     virtual AAFRESULT GetCompression(aafUID_t* pCompression) = 0;
     virtual AAFRESULT SetStoredView(aafUInt32 StoredHeight, aafUInt32 StoredWidth) = 0;
     virtual AAFRESULT GetStoredView(aafUInt32* pStoredHeight, aafUInt32* pStoredWidth) = 0;
-    virtual AAFRESULT SetSampledView(aafUInt32 SampledHeight, aafUInt32 SampledWidth, aafInt32 SampledXOffset, aafInt32 SampledYOffset) = 0;
-    virtual AAFRESULT GetSampledView(aafUInt32* pSampledHeight, aafUInt32* pSampledWidth, aafInt32* pSampledXOffset, aafInt32* pSampledYOffset) = 0;
-    virtual AAFRESULT SetDisplayView(aafUInt32 DisplayedHeight, aafUInt32 DisplayedWidth, aafInt32 DisplayedXOffset, aafInt32 DisplayedYOffset) = 0;
-    virtual AAFRESULT GetDisplayView(aafUInt32* pDisplayedHeight, aafUInt32* pDisplayedWidth, aafInt32* pDisplayedXOffset, aafInt32* pDisplayedYOffset) = 0;
+    virtual AAFRESULT SetSampledView(aafUInt32 SampledHeight, aafUInt32 SampledWidth, aafInt32 SampledXOffset,
+                                     aafInt32 SampledYOffset) = 0;
+    virtual AAFRESULT GetSampledView(aafUInt32* pSampledHeight, aafUInt32* pSampledWidth, aafInt32* pSampledXOffset,
+                                     aafInt32* pSampledYOffset) = 0;
+    virtual AAFRESULT SetDisplayView(aafUInt32 DisplayedHeight, aafUInt32 DisplayedWidth, aafInt32 DisplayedXOffset,
+                                     aafInt32 DisplayedYOffset) = 0;
+    virtual AAFRESULT GetDisplayView(aafUInt32* pDisplayedHeight, aafUInt32* pDisplayedWidth,
+                                     aafInt32* pDisplayedXOffset, aafInt32* pDisplayedYOffset) = 0;
     virtual AAFRESULT SetFrameLayout(aafFrameLayout_t FrameLayout) = 0;
     virtual AAFRESULT GetFrameLayout(aafFrameLayout_t* pFrameLayout) = 0;
     virtual AAFRESULT SetVideoLineMap(aafUInt32 numberElements, aafInt32* pVideoLineMap) = 0;

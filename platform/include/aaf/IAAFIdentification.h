@@ -5,7 +5,8 @@
 
 class IAAFIdentification : public IUnknown {
 public:
-    virtual AAFRESULT Initialize(aafCharacter_constptr companyName, aafCharacter_constptr productName, aafCharacter_constptr productVersionString, aafUID_constref productID) = 0;
+    virtual AAFRESULT Initialize(aafCharacter_constptr companyName, aafCharacter_constptr productName,
+                                 aafCharacter_constptr productVersionString, aafUID_constref productID) = 0;
     virtual AAFRESULT GetCompanyName(aafCharacter* pCompanyName, aafUInt32 bufSize) = 0;
     virtual AAFRESULT GetCompanyNameBufLen(aafUInt32* pBufSize) = 0;
     virtual AAFRESULT GetProductName(aafCharacter* pProductName, aafUInt32 bufSize) = 0;

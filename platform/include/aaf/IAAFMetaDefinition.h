@@ -5,7 +5,8 @@
 
 class IAAFMetaDefinition : public IUnknown {
 public:
-    virtual AAFRESULT Initialize(aafUID_constref id, aafCharacter_constptr pName, aafCharacter_constptr pDescription) = 0;
+    virtual AAFRESULT Initialize(aafUID_constref id, aafCharacter_constptr pName,
+                                 aafCharacter_constptr pDescription) = 0;
     virtual AAFRESULT GetAUID(aafUID_t* pAuid) = 0;
     virtual AAFRESULT SetName(aafCharacter_constptr pName) = 0;
     virtual AAFRESULT GetName(aafCharacter* pName, aafUInt32 bufSize) = 0;

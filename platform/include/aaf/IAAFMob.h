@@ -25,12 +25,16 @@ public:
     virtual AAFRESULT CountComments(aafUInt32* pNumComments) = 0;
     virtual AAFRESULT GetComments(IEnumAAFTaggedValues** ppEnum) = 0;
     virtual AAFRESULT RemoveComment(IAAFTaggedValue* pComment) = 0;
-    virtual AAFRESULT AppendNewTimelineSlot(aafRational_t editRate, IAAFSegment* pSegment, aafSlotID_t slotID, aafCharacter_constptr pSlotName, aafPosition_t origin, IAAFTimelineMobSlot** ppNewSlot) = 0;
-    virtual AAFRESULT GetMobInfo(aafTimeStamp_t* pLastModified, aafTimeStamp_t* pCreationTime, aafCharacter* pName, aafInt32 bufSize) = 0;
+    virtual AAFRESULT AppendNewTimelineSlot(aafRational_t editRate, IAAFSegment* pSegment, aafSlotID_t slotID,
+                                            aafCharacter_constptr pSlotName, aafPosition_t origin,
+                                            IAAFTimelineMobSlot** ppNewSlot) = 0;
+    virtual AAFRESULT GetMobInfo(aafTimeStamp_t* pLastModified, aafTimeStamp_t* pCreationTime, aafCharacter* pName,
+                                 aafInt32 bufSize) = 0;
     virtual AAFRESULT OffsetToMobTimecode(IAAFSegment* pTcSeg, aafPosition_t* pOffset, aafTimecode_t* pResult) = 0;
     virtual AAFRESULT LookupSlot(aafSlotID_t slotId, IAAFMobSlot** ppDestSlot) = 0;
     virtual AAFRESULT ChangeRef(aafMobID_constref oldMobID, aafMobID_constref newMobID) = 0;
-    virtual AAFRESULT CloneExternal(aafDepend_t resolveDependencies, aafIncMedia_t includeMedia, IAAFFile* pDestFile, IAAFMob** ppDestMob) = 0;
+    virtual AAFRESULT CloneExternal(aafDepend_t resolveDependencies, aafIncMedia_t includeMedia, IAAFFile* pDestFile,
+                                    IAAFMob** ppDestMob) = 0;
     virtual AAFRESULT Copy(aafCharacter_constptr pDestMobName, IAAFMob** ppDestMob) = 0;
     virtual AAFRESULT AppendKLVData(IAAFKLVData* pData) = 0;
     virtual AAFRESULT CountKLVData(aafUInt32* pNumData) = 0;

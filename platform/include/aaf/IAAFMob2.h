@@ -10,8 +10,11 @@ public:
     virtual AAFRESULT RemoveAttribute(IAAFTaggedValue* pAttribute) = 0;
     virtual AAFRESULT SetUsageCode(aafUID_constref usageCode) = 0;
     virtual AAFRESULT GetUsageCode(aafUID_t* pUsageCode) = 0;
-    virtual AAFRESULT AppendNewStaticSlot(IAAFSegment* pSegment, aafSlotID_t slotID, aafCharacter_constptr pSlotName, IAAFStaticMobSlot** ppNewSlot) = 0;
-    virtual AAFRESULT AppendNewEventSlot(aafRational_t editRate, IAAFSegment* pSegment, aafSlotID_t slotID, aafCharacter_constptr pSlotName, aafPosition_t origin, IAAFEventMobSlot** ppNewSlot) = 0;
+    virtual AAFRESULT AppendNewStaticSlot(IAAFSegment* pSegment, aafSlotID_t slotID, aafCharacter_constptr pSlotName,
+                                          IAAFStaticMobSlot** ppNewSlot) = 0;
+    virtual AAFRESULT AppendNewEventSlot(aafRational_t editRate, IAAFSegment* pSegment, aafSlotID_t slotID,
+                                         aafCharacter_constptr pSlotName, aafPosition_t origin,
+                                         IAAFEventMobSlot** ppNewSlot) = 0;
 
 protected:
     ~IAAFMob2() = default;

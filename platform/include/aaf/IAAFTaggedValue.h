@@ -5,7 +5,8 @@
 
 class IAAFTaggedValue : public IUnknown {
 public:
-    virtual AAFRESULT Initialize(aafCharacter_constptr pName, IAAFTypeDef* pTypeDef, aafUInt32 valueSize, aafDataBuffer_t pValue) = 0;
+    virtual AAFRESULT Initialize(aafCharacter_constptr pName, IAAFTypeDef* pTypeDef, aafUInt32 valueSize,
+                                 aafDataBuffer_t pValue) = 0;
     virtual AAFRESULT GetName(aafCharacter* pName, aafUInt32 bufSize) = 0;
     virtual AAFRESULT GetNameBufLen(aafUInt32* pLen) = 0;
     virtual AAFRESULT GetTypeDefinition(IAAFTypeDef** ppTypeDef) = 0;

@@ -4,7 +4,8 @@
 
 class IAAFTypeDefEnum : public IAAFTypeDef {
 public:
-    virtual AAFRESULT Initialize(aafUID_constref id, IAAFTypeDef* pType, aafInt64* pElementValues, aafString_t* pElementNames, aafUInt32 numElems, aafCharacter_constptr pTypeName) = 0;
+    virtual AAFRESULT Initialize(aafUID_constref id, IAAFTypeDef* pType, aafInt64* pElementValues,
+                                 aafString_t* pElementNames, aafUInt32 numElems, aafCharacter_constptr pTypeName) = 0;
     virtual AAFRESULT CreateValueFromName(aafCharacter_constptr Name, IAAFPropertyValue** ppPropVal) = 0;
     virtual AAFRESULT GetElementType(IAAFTypeDef** ppTypeDef) = 0;
     virtual AAFRESULT GetElementValue(aafUInt32 index, aafInt64* pOutValue) = 0;

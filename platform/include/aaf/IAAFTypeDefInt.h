@@ -4,7 +4,8 @@
 
 class IAAFTypeDefInt : public IAAFTypeDef {
 public:
-    virtual AAFRESULT Initialize(aafUID_constref id, aafUInt8 intSize, aafBool isSigned, aafCharacter_constptr pTypeName) = 0;
+    virtual AAFRESULT Initialize(aafUID_constref id, aafUInt8 intSize, aafBool isSigned,
+                                 aafCharacter_constptr pTypeName) = 0;
     virtual AAFRESULT CreateValue(aafMemPtr_t pVal, aafUInt32 valSize, IAAFPropertyValue** ppPropVal) = 0;
     virtual AAFRESULT GetInteger(IAAFPropertyValue* pPropVal, aafMemPtr_t pVal, aafUInt32 valSize) = 0;
     virtual AAFRESULT SetInteger(IAAFPropertyValue* pPropVal, aafMemPtr_t pVal, aafUInt32 valSize) = 0;

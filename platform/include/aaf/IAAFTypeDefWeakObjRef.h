@@ -4,7 +4,8 @@
 
 class IAAFTypeDefWeakObjRef : public IAAFTypeDefObjectRef {
 public:
-    virtual AAFRESULT Initialize(aafUID_constref id, IAAFClassDef* pObjType, aafCharacter_constptr pTypeName, aafUInt32 ids, aafUID_constptr pTargetSet) = 0;
+    virtual AAFRESULT Initialize(aafUID_constref id, IAAFClassDef* pObjType, aafCharacter_constptr pTypeName,
+                                 aafUInt32 ids, aafUID_constptr pTargetSet) = 0;
 
 protected:
     ~IAAFTypeDefWeakObjRef() = default;

@@ -1,7 +1,8 @@
 #pragma once
 #include "tov/ITOVUnknown.h"
 
-inline constexpr _tovUID IID_ITOVComponentFactory = {0x382B6A96, 0x7FD0, 0x11D6, {0xBC, 0xFE, 0x00, 0x30, 0x65, 0x42, 0xA0, 0x24}};
+inline constexpr _tovUID IID_ITOVComponentFactory = {
+    0x382B6A96, 0x7FD0, 0x11D6, {0xBC, 0xFE, 0x00, 0x30, 0x65, 0x42, 0xA0, 0x24}};
 
 /// The host's factory: every component reaches every other one through it.
 class ITOVComponentFactory : public ITOVUnknown {

@@ -1,7 +1,8 @@
 #pragma once
 #include "tov/ITOVDefinition.h"
 
-inline constexpr _tovUID IID_ITOVPluginDefinition = {0x9EA764EF, 0xBC2A, 0x41E9, {0xA7, 0xDE, 0x20, 0x9C, 0xB5, 0x46, 0xDF, 0xA9}};
+inline constexpr _tovUID IID_ITOVPluginDefinition = {
+    0x9EA764EF, 0xBC2A, 0x41E9, {0xA7, 0xDE, 0x20, 0x9C, 0xB5, 0x46, 0xDF, 0xA9}};
 
 /// What a module says of itself when the host catalogues it.
 class ITOVPluginDefinition : public ITOVDefinition {

@@ -26,8 +26,7 @@ TEST_F(HostFactory, MakesTheStringComponentByItsIdentifier) {
 TEST_F(HostFactory, FindsTheStringClassThroughItsDefinition) {
     // The route that library start-up takes: definition, class id, class factory.
     TOVPtr<ITOVComponentDefinition> definition;
-    ASSERT_EQ(host->GetComponentDefinition(TOVCompID_TOVString, IID_ITOVComponentDefinition, definition.Out()),
-              TOV_OK);
+    ASSERT_EQ(host->GetComponentDefinition(TOVCompID_TOVString, IID_ITOVComponentDefinition, definition.Out()), TOV_OK);
     _tovUID clsid{};
     ASSERT_EQ(definition->GetAttribute(TOVATTR_Component_CLSID, TOVTypeID_UID, &clsid, sizeof clsid), TOV_OK);
     TOVPtr<ITOVClassFactory> factory;
@@ -56,10 +55,8 @@ TEST_F(HostFactory, AnswersItsThreeServices) {
 }
 
 TEST_F(HostFactory, RefusesASecondRegistrationOfOneComponent) {
-    EXPECT_EQ(host->RegisterBuiltin(TOVCompID_TOVString, kUnknownID, L"again", [](ITOVUnknown*, ITOVUnknown*,
-                                                                                  const _tovUID&, void**) {
-        return TOV_E_FAIL;
-    }),
+    EXPECT_EQ(host->RegisterBuiltin(TOVCompID_TOVString, kUnknownID, L"again",
+                                    [](ITOVUnknown*, ITOVUnknown*, const _tovUID&, void**) { return TOV_E_FAIL; }),
               ZEB_E_ALREADYSET);
 }
 
@@ -72,9 +69,9 @@ struct AttributeCase {
 
 TEST_F(HostFactory, DefinitionAttributesAreTypedAndSized) {
     TOVPtr<ITOVComponentDefinition> definition;
-    ASSERT_EQ(host->CreateComponent(TOVCompID_ComponentDefinition, nullptr, IID_ITOVComponentDefinition,
-                                    definition.Out()),
-              TOV_OK);
+    ASSERT_EQ(
+        host->CreateComponent(TOVCompID_ComponentDefinition, nullptr, IID_ITOVComponentDefinition, definition.Out()),
+        TOV_OK);
     const uint32_t build = 10178;
     ASSERT_EQ(definition->SetAttribute(TOVATTR_Definition_BuildVersion, TOVTypeID_UInt32, &build, 4), TOV_OK);
 
@@ -98,8 +95,7 @@ TEST_F(HostFactory, DefinitionAttributesAreTypedAndSized) {
 
 TEST_F(HostFactory, UnicodeAttributeOfUnknownSizeKeepsItsTerminator) {
     TOVPtr<ITOVPluginDefinition> definition;
-    ASSERT_EQ(host->CreateComponent(TOVCompID_PluginDefinition, nullptr, IID_ITOVPluginDefinition,
-                                    definition.Out()),
+    ASSERT_EQ(host->CreateComponent(TOVCompID_PluginDefinition, nullptr, IID_ITOVPluginDefinition, definition.Out()),
               TOV_OK);
     const wchar_t description[] = L"Orlo * Media Stream Plug-in (MSP)";
     ASSERT_EQ(definition->SetAttribute(TOVATTR_Definition_Description, TOVTypeID_UnicodeString, description, -1),
@@ -109,19 +105,16 @@ TEST_F(HostFactory, UnicodeAttributeOfUnknownSizeKeepsItsTerminator) {
     ASSERT_EQ(definition->GetAttribute(TOVATTR_Definition_Description, TOVTypeID_UnicodeString, out, sizeof out),
               TOV_OK);
     EXPECT_STREQ(out, description);
-    EXPECT_EQ(definition->SetAttribute(TOVATTR_Definition_Description, TOVTypeID_UInt32, nullptr, 4),
-              TOV_E_INVALIDARG);
-    EXPECT_EQ(definition->SetAttribute(TOVATTR_Definition_Description, TOVTypeID_UInt32, &out, -1),
-              TOV_E_INVALIDARG);
+    EXPECT_EQ(definition->SetAttribute(TOVATTR_Definition_Description, TOVTypeID_UInt32, nullptr, 4), TOV_E_INVALIDARG);
+    EXPECT_EQ(definition->SetAttribute(TOVATTR_Definition_Description, TOVTypeID_UInt32, &out, -1), TOV_E_INVALIDARG);
 }
 
 TEST_F(HostFactory, ComponentDefinitionInitializeSetsTheClassAttribute) {
     TOVPtr<ITOVComponentDefinition> definition;
-    ASSERT_EQ(host->CreateComponent(TOVCompID_ComponentDefinition, nullptr, IID_ITOVComponentDefinition,
-                                    definition.Out()),
-              TOV_OK);
-    ASSERT_EQ(definition->Initialize(kUnknownID, TOVCompType_OrrinMediaAccess, 1, 9, IID_ITOVString, L"Name"),
-              TOV_OK);
+    ASSERT_EQ(
+        host->CreateComponent(TOVCompID_ComponentDefinition, nullptr, IID_ITOVComponentDefinition, definition.Out()),
+        TOV_OK);
+    ASSERT_EQ(definition->Initialize(kUnknownID, TOVCompType_OrrinMediaAccess, 1, 9, IID_ITOVString, L"Name"), TOV_OK);
     _tovUID clsid{};
     ASSERT_EQ(definition->GetAttribute(TOVATTR_Component_CLSID, TOVTypeID_UID, &clsid, sizeof clsid), TOV_OK);
     EXPECT_EQ(clsid, IID_ITOVString);

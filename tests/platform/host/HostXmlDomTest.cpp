@@ -52,8 +52,8 @@ protected:
 };
 
 TEST_F(HostXmlDom, ChildrenKeepDocumentOrderAndTheirTypes) {
-    TOVPtr<ITOVXmlDomNode> root = Root(
-        "<BWFXML><!-- made by hand --><SCENE>12A</SCENE>text<![CDATA[<raw>]]><?pi data?></BWFXML>");
+    TOVPtr<ITOVXmlDomNode> root =
+        Root("<BWFXML><!-- made by hand --><SCENE>12A</SCENE>text<![CDATA[<raw>]]><?pi data?></BWFXML>");
     EXPECT_EQ(Name(root.Get()), "BWFXML");
     ASSERT_EQ(root->GetChildCount(), 5u);
     const struct {
@@ -129,7 +129,8 @@ TEST_F(HostXmlDom, AFileIsReadInItsDeclaredEncoding) {
     const std::string path = ::testing::TempDir() + "latin1.xml";
     {
         std::ofstream file(path, std::ios::binary);
-        file << "<?xml version=\"1.0\" encoding=\"ISO-8859-1\"?><NOTE>Gr\xFC\xDF" "e</NOTE>";
+        file << "<?xml version=\"1.0\" encoding=\"ISO-8859-1\"?><NOTE>Gr\xFC\xDF"
+                "e</NOTE>";
     }
     TOVPtr<ITOVXmlParser> parser = Parser();
     ASSERT_EQ(parser->ParseFile(Str(path).Get()), TOV_OK);

@@ -61,8 +61,7 @@ private:
 class HostXmlSax : public ::testing::Test {
 protected:
     void SetUp() override {
-        ASSERT_EQ(host->CreateComponent(CompID_TOVXmlSaxReader, nullptr, IID_ITOVXmlSaxParser, parser.Out()),
-                  TOV_OK);
+        ASSERT_EQ(host->CreateComponent(CompID_TOVXmlSaxReader, nullptr, IID_ITOVXmlSaxParser, parser.Out()), TOV_OK);
         ASSERT_EQ(parser->SetDocumentHandler(&handler), TOV_OK);
         ASSERT_EQ(parser->SetErrorHandler(&handler), TOV_OK);
     }
@@ -82,12 +81,11 @@ protected:
 };
 
 TEST_F(HostXmlSax, ReportsElementsAttributesAndTextInOrder) {
-    ASSERT_EQ(parser->Parse(Str(R"(<SCMain><Audio DropFrameFlag="true">é<![CDATA[x]]></Audio></SCMain>)").Get(),
-                            nullptr),
-              TOV_OK);
+    ASSERT_EQ(
+        parser->Parse(Str(R"(<SCMain><Audio DropFrameFlag="true">é<![CDATA[x]]></Audio></SCMain>)").Get(), nullptr),
+        TOV_OK);
     EXPECT_EQ(handler.events, (std::vector<std::string>{"start", "element SCMain", "element Audio",
-                                                        "attribute DropFrameFlag=true", "text é", "text x",
-                                                        "end"}));
+                                                        "attribute DropFrameFlag=true", "text é", "text x", "end"}));
     EXPECT_TRUE(handler.errors.empty());
 }
 
@@ -144,10 +142,10 @@ protected:
         std::ofstream(secretPath) << kSecret;
         attacks = {
             {"billion laughs", BillionLaughs()},
-            {"external entity", "<?xml version=\"1.0\"?><!DOCTYPE r [<!ENTITY s SYSTEM \"file://" + secretPath +
-                                    "\">]><r>&s;</r>"},
-            {"external parameter entity", "<?xml version=\"1.0\"?><!DOCTYPE r [<!ENTITY % p SYSTEM \"file://" +
-                                              secretPath + "\"> %p;]><r/>"},
+            {"external entity",
+             "<?xml version=\"1.0\"?><!DOCTYPE r [<!ENTITY s SYSTEM \"file://" + secretPath + "\">]><r>&s;</r>"},
+            {"external parameter entity",
+             "<?xml version=\"1.0\"?><!DOCTYPE r [<!ENTITY % p SYSTEM \"file://" + secretPath + "\"> %p;]><r/>"},
             {"external subset", "<?xml version=\"1.0\"?><!DOCTYPE r SYSTEM \"file://" + secretPath + "\"><r>x</r>"},
             {"100,000 deep", Nested(100000)},
         };
@@ -190,8 +188,7 @@ TEST_F(XmlAttacks, TheSaxReaderRefusesOrReadsWithoutExpansion) {
     for (const Attack& attack : attacks) {
         RecordingHandler handler;
         TOVPtr<ITOVXmlSaxParser> parser;
-        ASSERT_EQ(host->CreateComponent(CompID_TOVXmlSaxReader, nullptr, IID_ITOVXmlSaxParser, parser.Out()),
-                  TOV_OK);
+        ASSERT_EQ(host->CreateComponent(CompID_TOVXmlSaxReader, nullptr, IID_ITOVXmlSaxParser, parser.Out()), TOV_OK);
         parser->SetDocumentHandler(&handler);
         parser->SetErrorHandler(&handler);
         const TOVRESULT result = parser->Parse(Str(attack.text).Get(), nullptr);

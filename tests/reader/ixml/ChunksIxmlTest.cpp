@@ -19,10 +19,10 @@ std::string WaveWithIxml(const std::string& xml) {
 }
 
 TEST(ChunksIxml, ParsedValuesAndNulls) {
-    TempFile file(WaveWithIxml(
-        "<?xml version=\"1.0\" encording=\"UTF-8\"?><BWFXML><SCENE>42A</SCENE><CIRCLED>TRUE</CIRCLED>"
-        "<SPEED><TIMECODE_RATE>25/1</TIMECODE_RATE></SPEED>"
-        "<TRACK_LIST><TRACK><NAME>Boom</NAME></TRACK></TRACK_LIST></BWFXML>\r\n"));
+    TempFile file(
+        WaveWithIxml("<?xml version=\"1.0\" encording=\"UTF-8\"?><BWFXML><SCENE>42A</SCENE><CIRCLED>TRUE</CIRCLED>"
+                     "<SPEED><TIMECODE_RATE>25/1</TIMECODE_RATE></SPEED>"
+                     "<TRACK_LIST><TRACK><NAME>Boom</NAME></TRACK></TRACK_LIST></BWFXML>\r\n"));
     const ToolOutcome outcome = RunTool(ORLO_TOOL, "-q chunks --json " + file.Path());
     ASSERT_EQ(outcome.status, 0) << outcome.out;
     const auto json = nlohmann::json::parse(outcome.out)["ixml"];

@@ -31,8 +31,7 @@ struct Repair {
 TEST_F(IXMLChunkTest, TextIsMendedBeforeAnyoneParsesIt) {
     const Repair cases[] = {
         {"as written", "<BWFXML><SCENE>1</SCENE></BWFXML>", "<BWFXML><SCENE>1</SCENE></BWFXML>"},
-        {"padding behind the root", std::string("<BWFXML/>") + std::string(37, '\0'),
-         "<BWFXML/>"},
+        {"padding behind the root", std::string("<BWFXML/>") + std::string(37, '\0'), "<BWFXML/>"},
         {"spaces and a line feed behind the root", "<BWFXML/>  \r\n  ", "<BWFXML/>"},
         {"misspelled declaration", "<?xml version=\"1.0\" encording=\"UTF-8\"?><BWFXML/>",
          "<?xml version=\"1.0\" encoding=\"UTF-8\"?><BWFXML/>"},

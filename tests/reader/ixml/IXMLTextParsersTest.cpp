@@ -53,7 +53,7 @@ TEST_F(IXMLTextParsers, WordsAreExactCapitals) {
         bool dropOk;
         bool dropValue;
     } cases[] = {
-        {"TRUE", true, true, false, false},  {"FALSE", true, false, false, false},
+        {"TRUE", true, true, false, false},   {"FALSE", true, false, false, false},
         {"true", false, false, false, false}, {" TRUE", false, false, false, false},
         {"DF", false, false, true, true},     {"NDF", false, false, true, false},
         {"df", false, false, false, false},   {"", false, false, false, false},

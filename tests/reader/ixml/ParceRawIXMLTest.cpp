@@ -166,8 +166,7 @@ TEST_F(ParceRawIXMLTest, SpeedVariants) {
     };
     for (const auto& c : cases) {
         IXMLData one;
-        ASSERT_EQ(ParceRawIXML(std::string("<BWFXML><SPEED>") + c.speed + "</SPEED></BWFXML>", host.Get(), one),
-                  TOV_OK)
+        ASSERT_EQ(ParceRawIXML(std::string("<BWFXML><SPEED>") + c.speed + "</SPEED></BWFXML>", host.Get(), one), TOV_OK)
             << c.speed;
         const IXMLSpeed speed = one.GetSpeed();
         EXPECT_EQ(speed.HasTimeCodeRate(), c.hasRate) << c.speed;

@@ -8,9 +8,7 @@
 
 #include "tov/ITOVXmlDom.h"
 
-class FakeXmlNode : public UTIL::ITOVXmlDomElement,
-                    public UTIL::ITOVXmlDomAttribute,
-                    public UTIL::ITOVXmlDomNodeList {
+class FakeXmlNode : public UTIL::ITOVXmlDomElement, public UTIL::ITOVXmlDomAttribute, public UTIL::ITOVXmlDomNodeList {
 public:
     FakeXmlNode(int32_t type, std::string name, std::string value);
     virtual ~FakeXmlNode() = default;

@@ -44,7 +44,9 @@ public:
     }
 
 private:
-    static std::string Read(ITOVString* s) { return reinterpret_cast<const char*>(ZEB::ZEBString(s, 0).GetUTF8String()); }
+    static std::string Read(ITOVString* s) {
+        return reinterpret_cast<const char*>(ZEB::ZEBString(s, 0).GetUTF8String());
+    }
     TOVRESULT Record(const std::string& line) {
         m_Log.push_back(line);
         return TOV_OK;

@@ -42,8 +42,8 @@ TEST_F(XmlDocument, ParseFailuresLeaveNoRoot) {
         {"null root", [](FakeXmlFactory& f, FakeXmlDom&) { f.root = nullptr; }, TOV_E_POINTER},
         {"root without node view", [](FakeXmlFactory& f, FakeXmlDom&) { f.root->queryResult = TOV_E_NOINTERFACE; },
          TOV_E_NOINTERFACE},
-        {"root is a comment",
-         [](FakeXmlFactory& f, FakeXmlDom& d) { f.root = d.Node(UTIL::kTOVXmlComment, "c"); }, TOV_E_NOTSUPPORTED},
+        {"root is a comment", [](FakeXmlFactory& f, FakeXmlDom& d) { f.root = d.Node(UTIL::kTOVXmlComment, "c"); },
+         TOV_E_NOTSUPPORTED},
         {"root is text", [](FakeXmlFactory& f, FakeXmlDom& d) { f.root = d.Text("t"); }, TOV_E_NOTSUPPORTED},
     };
     for (const auto& c : cases) {
@@ -100,8 +100,8 @@ TEST_F(XmlDocument, EachWriteUsesAFreshWriter) {
     ASSERT_EQ(doc.Save(Z("/tmp/out.xml")), TOV_OK);
     ASSERT_EQ(doc.WriteTo(out), TOV_OK);
     EXPECT_EQ(S(out), "recorded");
-    EXPECT_EQ(factory.log,
-              (std::vector<std::string>{"open /tmp/out.xml", "element ROOT", "close", "open <memory>", "element ROOT"}));
+    EXPECT_EQ(factory.log, (std::vector<std::string>{"open /tmp/out.xml", "element ROOT", "close", "open <memory>",
+                                                     "element ROOT"}));
     EXPECT_EQ(factory.writers, 1) << "the earlier writer was not released";
 
     factory.createResult = TOV_E_FAIL;

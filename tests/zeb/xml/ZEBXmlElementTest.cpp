@@ -149,8 +149,8 @@ TEST_F(XmlElement, ChangesThatAreRefused) {
         std::function<TOVRESULT(ZEBXmlElement&)> call;
         TOVRESULT expected;
     } cases[] = {
-        {"attribute set before any load", "<R a='1'/>",
-         [](ZEBXmlElement& r) { return r.SetAttribute(Z("a"), Z("2")); }, ZEB_E_NOTREADY},
+        {"attribute set before any load", "<R a='1'/>", [](ZEBXmlElement& r) { return r.SetAttribute(Z("a"), Z("2")); },
+         ZEB_E_NOTREADY},
         {"bound attribute renamed", "<R a='1'/>",
          [](ZEBXmlElement& r) { return r.GetAttributeNode(Z("a"))->SetName(Z("b")); }, TOV_E_UNEXPECTED},
         {"new attribute given a taken name", "<R a='1'/>",

@@ -29,10 +29,10 @@ struct BuiltinDefinitions {
             *headerIdentificationList;
         PropertyDefinition *identCompanyName, *identProductName, *identProductVersion, *identProductVersionString,
             *identProductID, *identDate, *identToolkitVersion, *identPlatform, *identGenerationAUID;
-        PropertyDefinition* contentMobs;
+        PropertyDefinition *contentMobs;
         PropertyDefinition *mobMobID, *mobName, *mobSlots, *mobLastModified, *mobCreationTime, *mobUserComments,
             *mobAttributes, *mobUsageCode;
-        PropertyDefinition* sourceMobEssenceDescription;
+        PropertyDefinition *sourceMobEssenceDescription;
         PropertyDefinition *slotSlotID, *slotSlotName, *slotSegment, *slotPhysicalTrackNumber;
         PropertyDefinition *timelineEditRate, *timelineOrigin, *eventSlotEditRate;
         PropertyDefinition *componentDataDefinition, *componentLength, *componentUserComments, *componentAttributes;

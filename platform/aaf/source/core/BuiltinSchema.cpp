@@ -2,6 +2,38 @@
 
 #include <cstddef>
 
+#include "../views/CommentMarkerView.h"
+#include "../views/ComponentView.h"
+#include "../views/ContentStorageView.h"
+#include "../views/DescriptiveMarkerView.h"
+#include "../views/DictionaryView.h"
+#include "../views/DigitalImageDescriptorView.h"
+#include "../views/EssenceDescriptorView.h"
+#include "../views/EventMobSlotView.h"
+#include "../views/EventView.h"
+#include "../views/FileDescriptorView.h"
+#include "../views/FillerView.h"
+#include "../views/HeaderView.h"
+#include "../views/IdentificationView.h"
+#include "../views/ImportDescriptorView.h"
+#include "../views/LocatorView.h"
+#include "../views/MasterMobView.h"
+#include "../views/MobSlotView.h"
+#include "../views/MobView.h"
+#include "../views/MultipleDescriptorView.h"
+#include "../views/NetworkLocatorView.h"
+#include "../views/ObjectView.h"
+#include "../views/PCMDescriptorView.h"
+#include "../views/SegmentView.h"
+#include "../views/SequenceView.h"
+#include "../views/SoundDescriptorView.h"
+#include "../views/SourceClipView.h"
+#include "../views/SourceMobView.h"
+#include "../views/SourceReferenceView.h"
+#include "../views/TaggedValueView.h"
+#include "../views/TapeDescriptorView.h"
+#include "../views/TimecodeView.h"
+#include "../views/TimelineMobSlotView.h"
 #include "ClassDefinition.h"
 #include "DataDefinition.h"
 #include "PropertyDefinition.h"
@@ -20,38 +52,6 @@
 #include "aaf/AAFDataDefs.h"
 #include "aaf/AAFPropertyDefs.h"
 #include "aaf/AAFTypeDefUIDs.h"
-#include "../views/ComponentView.h"
-#include "../views/ContentStorageView.h"
-#include "../views/DictionaryView.h"
-#include "../views/EssenceDescriptorView.h"
-#include "../views/EventMobSlotView.h"
-#include "../views/EventView.h"
-#include "../views/CommentMarkerView.h"
-#include "../views/DescriptiveMarkerView.h"
-#include "../views/FileDescriptorView.h"
-#include "../views/FillerView.h"
-#include "../views/HeaderView.h"
-#include "../views/IdentificationView.h"
-#include "../views/ImportDescriptorView.h"
-#include "../views/LocatorView.h"
-#include "../views/MasterMobView.h"
-#include "../views/MobSlotView.h"
-#include "../views/MobView.h"
-#include "../views/MultipleDescriptorView.h"
-#include "../views/NetworkLocatorView.h"
-#include "../views/ObjectView.h"
-#include "../views/PCMDescriptorView.h"
-#include "../views/SegmentView.h"
-#include "../views/SequenceView.h"
-#include "../views/SoundDescriptorView.h"
-#include "../views/DigitalImageDescriptorView.h"
-#include "../views/SourceClipView.h"
-#include "../views/SourceMobView.h"
-#include "../views/SourceReferenceView.h"
-#include "../views/TaggedValueView.h"
-#include "../views/TapeDescriptorView.h"
-#include "../views/TimecodeView.h"
-#include "../views/TimelineMobSlotView.h"
 
 namespace aafmodel {
 
@@ -130,25 +130,24 @@ private:
                         {offsetof(aafUID_t, Data1), offsetof(aafUID_t, Data2), offsetof(aafUID_t, Data3),
                          offsetof(aafUID_t, Data4)},
                         sizeof(aafUID_t));
-        t.mobID = Record(kAAFTypeID_MobIDType, L"MobIDType",
-                         {{bytes12, L"SMPTELabel"},
-                          {t.uint8, L"length"},
-                          {t.uint8, L"instanceHigh"},
-                          {t.uint8, L"instanceMid"},
-                          {t.uint8, L"instanceLow"},
-                          {t.auid, L"material"}},
-                         {offsetof(aafMobID_t, SMPTELabel), offsetof(aafMobID_t, length),
-                          offsetof(aafMobID_t, instanceHigh), offsetof(aafMobID_t, instanceMid),
-                          offsetof(aafMobID_t, instanceLow), offsetof(aafMobID_t, material)},
-                         sizeof(aafMobID_t));
-        t.rational = Record(kAAFTypeID_Rational, L"Rational", {{t.int32, L"Numerator"}, {t.int32, L"Denominator"}},
-                            {offsetof(aafRational_t, numerator), offsetof(aafRational_t, denominator)},
-                            sizeof(aafRational_t));
-        auto* date = Record(kAAFTypeID_DateStruct, L"DateStruct",
-                            {{t.int16, L"year"}, {t.uint8, L"month"}, {t.uint8, L"day"}},
-                            {offsetof(aafDateStruct_t, year), offsetof(aafDateStruct_t, month),
-                             offsetof(aafDateStruct_t, day)},
-                            sizeof(aafDateStruct_t));
+        t.mobID = Record(
+            kAAFTypeID_MobIDType, L"MobIDType",
+            {{bytes12, L"SMPTELabel"},
+             {t.uint8, L"length"},
+             {t.uint8, L"instanceHigh"},
+             {t.uint8, L"instanceMid"},
+             {t.uint8, L"instanceLow"},
+             {t.auid, L"material"}},
+            {offsetof(aafMobID_t, SMPTELabel), offsetof(aafMobID_t, length), offsetof(aafMobID_t, instanceHigh),
+             offsetof(aafMobID_t, instanceMid), offsetof(aafMobID_t, instanceLow), offsetof(aafMobID_t, material)},
+            sizeof(aafMobID_t));
+        t.rational =
+            Record(kAAFTypeID_Rational, L"Rational", {{t.int32, L"Numerator"}, {t.int32, L"Denominator"}},
+                   {offsetof(aafRational_t, numerator), offsetof(aafRational_t, denominator)}, sizeof(aafRational_t));
+        auto* date =
+            Record(kAAFTypeID_DateStruct, L"DateStruct", {{t.int16, L"year"}, {t.uint8, L"month"}, {t.uint8, L"day"}},
+                   {offsetof(aafDateStruct_t, year), offsetof(aafDateStruct_t, month), offsetof(aafDateStruct_t, day)},
+                   sizeof(aafDateStruct_t));
         auto* time = Record(kAAFTypeID_TimeStruct, L"TimeStruct",
                             {{t.uint8, L"hour"}, {t.uint8, L"minute"}, {t.uint8, L"second"}, {t.uint8, L"fraction"}},
                             {offsetof(aafTimeStruct_t, hour), offsetof(aafTimeStruct_t, minute),
@@ -164,17 +163,19 @@ private:
                                                      {L"VersionPatched", kAAFVersionPatched},
                                                      {L"VersionBeta", kAAFVersionBeta},
                                                      {L"VersionPrivateBuild", kAAFPrivateBuild}});
-        t.productVersion =
-            Record(kAAFTypeID_ProductVersion, L"ProductVersion",
-                   {{t.uint16, L"major"}, {t.uint16, L"minor"}, {t.uint16, L"tertiary"}, {t.uint16, L"patchLevel"},
-                    {releaseType, L"type"}},
-                   {offsetof(aafProductVersion_t, major), offsetof(aafProductVersion_t, minor),
-                    offsetof(aafProductVersion_t, tertiary), offsetof(aafProductVersion_t, patchLevel),
-                    offsetof(aafProductVersion_t, type)},
-                   sizeof(aafProductVersion_t));
-        t.versionType = Record(kAAFTypeID_VersionType, L"VersionType", {{t.int8, L"major"}, {t.int8, L"minor"}},
-                               {offsetof(aafVersionType_t, major), offsetof(aafVersionType_t, minor)},
-                               sizeof(aafVersionType_t));
+        t.productVersion = Record(kAAFTypeID_ProductVersion, L"ProductVersion",
+                                  {{t.uint16, L"major"},
+                                   {t.uint16, L"minor"},
+                                   {t.uint16, L"tertiary"},
+                                   {t.uint16, L"patchLevel"},
+                                   {releaseType, L"type"}},
+                                  {offsetof(aafProductVersion_t, major), offsetof(aafProductVersion_t, minor),
+                                   offsetof(aafProductVersion_t, tertiary), offsetof(aafProductVersion_t, patchLevel),
+                                   offsetof(aafProductVersion_t, type)},
+                                  sizeof(aafProductVersion_t));
+        t.versionType =
+            Record(kAAFTypeID_VersionType, L"VersionType", {{t.int8, L"major"}, {t.int8, L"minor"}},
+                   {offsetof(aafVersionType_t, major), offsetof(aafVersionType_t, minor)}, sizeof(aafVersionType_t));
         t.uint8Array = Vector(kAAFTypeID_UInt8Array, L"UInt8Array", t.uint8);
         t.uint32Array = Vector(kAAFTypeID_UInt32Array, L"UInt32Array", t.uint32);
         t.indirect = Type<TypeDefIndirectType>(kAAFTypeID_Indirect, L"Indirect");
@@ -239,8 +240,7 @@ private:
         c.waveDescriptor = Class(kAAFClassID_WAVEDescriptor, L"WAVEDescriptor", c.fileDescriptor, true);
         c.aifcDescriptor = Class(kAAFClassID_AIFCDescriptor, L"AIFCDescriptor", c.fileDescriptor, true);
         c.tapeDescriptor = Class(kAAFClassID_TapeDescriptor, L"TapeDescriptor", c.essenceDescriptor, true);
-        c.physicalDescriptor =
-            Class(kAAFClassID_PhysicalDescriptor, L"PhysicalDescriptor", c.essenceDescriptor, false);
+        c.physicalDescriptor = Class(kAAFClassID_PhysicalDescriptor, L"PhysicalDescriptor", c.essenceDescriptor, false);
         c.importDescriptor = Class(kAAFClassID_ImportDescriptor, L"ImportDescriptor", c.physicalDescriptor, true);
         c.locator = Class(kAAFClassID_Locator, L"Locator", c.interchangeObject, false);
         c.networkLocator = Class(kAAFClassID_NetworkLocator, L"NetworkLocator", c.locator, true);
@@ -298,23 +298,22 @@ private:
         auto* identRef =
             Strong(kAAFTypeID_IdentificationStrongReference, L"IdentificationStrongReference", c.identification);
 
-        p.headerContent = Prop(c.header, kAAFPropID_Header_Content, L"Content",
-                               Strong(kAAFTypeID_ContentStorageStrongReference, L"ContentStorageStrongReference",
-                                      c.contentStorage),
-                               false);
-        p.headerDictionary = Prop(
-            c.header, kAAFPropID_Header_Dictionary, L"Dictionary",
-            Strong(kAAFTypeID_DictionaryStrongReference, L"DictionaryStrongReference", c.dictionary), false);
-        p.headerIdentificationList =
-            Prop(c.header, kAAFPropID_Header_IdentificationList, L"IdentificationList",
-                 Vector(kAAFTypeID_IdentificationStrongReferenceVector, L"IdentificationStrongReferenceVector",
-                        identRef),
+        p.headerContent =
+            Prop(c.header, kAAFPropID_Header_Content, L"Content",
+                 Strong(kAAFTypeID_ContentStorageStrongReference, L"ContentStorageStrongReference", c.contentStorage),
                  false);
+        p.headerDictionary =
+            Prop(c.header, kAAFPropID_Header_Dictionary, L"Dictionary",
+                 Strong(kAAFTypeID_DictionaryStrongReference, L"DictionaryStrongReference", c.dictionary), false);
+        p.headerIdentificationList = Prop(
+            c.header, kAAFPropID_Header_IdentificationList, L"IdentificationList",
+            Vector(kAAFTypeID_IdentificationStrongReferenceVector, L"IdentificationStrongReferenceVector", identRef),
+            false);
         p.contentMobs = Prop(c.contentStorage, kAAFPropID_ContentStorage_Mobs, L"Mobs",
                              Vector(kAAFTypeID_MobStrongReferenceVector, L"MobStrongReferenceVector", mobRef), false);
-        p.mobSlots = Prop(c.mob, kAAFPropID_Mob_Slots, L"Slots",
-                          Vector(kAAFTypeID_MobSlotStrongReferenceVector, L"MobSlotStrongReferenceVector", slotRef),
-                          false);
+        p.mobSlots =
+            Prop(c.mob, kAAFPropID_Mob_Slots, L"Slots",
+                 Vector(kAAFTypeID_MobSlotStrongReferenceVector, L"MobSlotStrongReferenceVector", slotRef), false);
         p.mobUserComments = Prop(c.mob, kAAFPropID_Mob_UserComments, L"UserComments", tagged, true);
         p.mobAttributes = Prop(c.mob, kAAFPropID_Mob_Attributes, L"Attributes", tagged, true);
         p.sourceMobEssenceDescription =
@@ -324,25 +323,22 @@ private:
                  false);
         p.slotSegment = Prop(c.mobSlot, kAAFPropID_MobSlot_Segment, L"Segment",
                              Strong(kAAFTypeID_SegmentStrongReference, L"SegmentStrongReference", c.segment), false);
-        p.componentDataDefinition =
-            Prop(c.component, kAAFPropID_Component_DataDefinition, L"DataDefinition",
-                 Type<TypeDefWeakReference>(kAAFTypeID_DataDefinitionWeakReference, L"DataDefinitionWeakReference",
-                                            c.dataDefinition),
-                 false);
+        p.componentDataDefinition = Prop(c.component, kAAFPropID_Component_DataDefinition, L"DataDefinition",
+                                         Type<TypeDefWeakReference>(kAAFTypeID_DataDefinitionWeakReference,
+                                                                    L"DataDefinitionWeakReference", c.dataDefinition),
+                                         false);
         p.componentUserComments = Prop(c.component, kAAFPropID_Component_UserComments, L"UserComments", tagged, true);
         p.componentAttributes = Prop(c.component, kAAFPropID_Component_Attributes, L"Attributes", tagged, true);
-        p.sequenceComponents =
-            Prop(c.sequence, kAAFPropID_Sequence_Components, L"Components",
-                 Vector(kAAFTypeID_ComponentStrongReferenceVector, L"ComponentStrongReferenceVector", componentRef),
-                 false);
+        p.sequenceComponents = Prop(
+            c.sequence, kAAFPropID_Sequence_Components, L"Components",
+            Vector(kAAFTypeID_ComponentStrongReferenceVector, L"ComponentStrongReferenceVector", componentRef), false);
         p.essenceLocator =
             Prop(c.essenceDescriptor, kAAFPropID_EssenceDescriptor_Locator, L"Locator",
                  Vector(kAAFTypeID_LocatorStrongReferenceVector, L"LocatorStrongReferenceVector", locatorRef), true);
-        p.multipleFileDescriptors = Prop(c.multipleDescriptor, kAAFPropID_MultipleDescriptor_FileDescriptors,
-                                         L"FileDescriptors",
-                                         Vector(kAAFTypeID_FileDescriptorStrongReferenceVector,
-                                                L"FileDescriptorStrongReferenceVector", fileDescRef),
-                                         false);
+        p.multipleFileDescriptors = Prop(
+            c.multipleDescriptor, kAAFPropID_MultipleDescriptor_FileDescriptors, L"FileDescriptors",
+            Vector(kAAFTypeID_FileDescriptorStrongReferenceVector, L"FileDescriptorStrongReferenceVector", fileDescRef),
+            false);
         p.taggedValueValue = Prop(c.taggedValue, kAAFPropID_TaggedValue_Value, L"Value", t.indirect, false);
     }
 
@@ -357,14 +353,14 @@ private:
             Prop(c.identification, kAAFPropID_Identification_CompanyName, L"CompanyName", t.string, false);
         p.identProductName =
             Prop(c.identification, kAAFPropID_Identification_ProductName, L"ProductName", t.string, false);
-        p.identProductVersion = Prop(c.identification, kAAFPropID_Identification_ProductVersion, L"ProductVersion",
-                                     t.productVersion, true);
+        p.identProductVersion =
+            Prop(c.identification, kAAFPropID_Identification_ProductVersion, L"ProductVersion", t.productVersion, true);
         p.identProductVersionString = Prop(c.identification, kAAFPropID_Identification_ProductVersionString,
                                            L"ProductVersionString", t.string, false);
         p.identProductID = Prop(c.identification, kAAFPropID_Identification_ProductID, L"ProductID", t.auid, false);
         p.identDate = Prop(c.identification, kAAFPropID_Identification_Date, L"Date", t.timeStamp, false);
-        p.identToolkitVersion = Prop(c.identification, kAAFPropID_Identification_ToolkitVersion, L"ToolkitVersion",
-                                     t.productVersion, true);
+        p.identToolkitVersion =
+            Prop(c.identification, kAAFPropID_Identification_ToolkitVersion, L"ToolkitVersion", t.productVersion, true);
         p.identPlatform = Prop(c.identification, kAAFPropID_Identification_Platform, L"Platform", t.string, true);
         p.identGenerationAUID =
             Prop(c.identification, kAAFPropID_Identification_GenerationAUID, L"GenerationAUID", t.auid, false);
@@ -386,8 +382,8 @@ private:
         p.timecodeFPS = Prop(c.timecode, kAAFPropID_Timecode_FPS, L"FPS", t.uint16, false);
         p.timecodeDrop = Prop(c.timecode, kAAFPropID_Timecode_Drop, L"Drop", t.boolean, false);
         p.sourceRefSourceID = Prop(c.sourceReference, kAAFPropID_SourceReference_SourceID, L"SourceID", t.mobID, true);
-        p.sourceRefSourceMobSlotID = Prop(c.sourceReference, kAAFPropID_SourceReference_SourceMobSlotID,
-                                          L"SourceMobSlotID", t.uint32, false);
+        p.sourceRefSourceMobSlotID =
+            Prop(c.sourceReference, kAAFPropID_SourceReference_SourceMobSlotID, L"SourceMobSlotID", t.uint32, false);
         p.sourceRefChannelIDs =
             Prop(c.sourceReference, kAAFPropID_SourceReference_ChannelIDs, L"ChannelIDs", t.uint32Array, true);
         p.sourceRefMonoSourceSlotIDs = Prop(c.sourceReference, kAAFPropID_SourceReference_MonoSourceSlotIDs,
@@ -396,7 +392,8 @@ private:
         p.eventPosition = Prop(c.event, kAAFPropID_Event_Position, L"Position", t.position, false);
         p.eventComment = Prop(c.event, kAAFPropID_Event_Comment, L"Comment", t.string, true);
         p.taggedValueName = Prop(c.taggedValue, kAAFPropID_TaggedValue_Name, L"Name", t.string, false);
-        p.fileSampleRate = Prop(c.fileDescriptor, kAAFPropID_FileDescriptor_SampleRate, L"SampleRate", t.rational, true);
+        p.fileSampleRate =
+            Prop(c.fileDescriptor, kAAFPropID_FileDescriptor_SampleRate, L"SampleRate", t.rational, true);
         p.fileLength = Prop(c.fileDescriptor, kAAFPropID_FileDescriptor_Length, L"Length", t.length, true);
         p.soundAudioSamplingRate = Prop(c.soundDescriptor, kAAFPropID_SoundDescriptor_AudioSamplingRate,
                                         L"AudioSamplingRate", t.rational, false);
@@ -404,12 +401,12 @@ private:
         p.soundElectroSpatial = Prop(c.soundDescriptor, kAAFPropID_SoundDescriptor_ElectroSpatial, L"ElectroSpatial",
                                      m_electroSpatial, true);
         p.soundChannels = Prop(c.soundDescriptor, kAAFPropID_SoundDescriptor_Channels, L"Channels", t.uint32, false);
-        p.soundQuantizationBits = Prop(c.soundDescriptor, kAAFPropID_SoundDescriptor_QuantizationBits,
-                                       L"QuantizationBits", t.uint32, false);
+        p.soundQuantizationBits =
+            Prop(c.soundDescriptor, kAAFPropID_SoundDescriptor_QuantizationBits, L"QuantizationBits", t.uint32, false);
         p.soundCompression =
             Prop(c.soundDescriptor, kAAFPropID_SoundDescriptor_Compression, L"Compression", t.auid, true);
-        p.imageCompression = Prop(c.digitalImageDescriptor, kAAFPropID_DigitalImageDescriptor_Compression,
-                                  L"Compression", t.auid, true);
+        p.imageCompression =
+            Prop(c.digitalImageDescriptor, kAAFPropID_DigitalImageDescriptor_Compression, L"Compression", t.auid, true);
         p.imageStoredHeight = Prop(c.digitalImageDescriptor, kAAFPropID_DigitalImageDescriptor_StoredHeight,
                                    L"StoredHeight", t.uint32, false);
         p.imageStoredWidth = Prop(c.digitalImageDescriptor, kAAFPropID_DigitalImageDescriptor_StoredWidth,
@@ -427,8 +424,7 @@ private:
             Prop(c.tapeDescriptor, kAAFPropID_TapeDescriptor_ManufacturerID, L"ManufacturerID", t.string, true);
         p.tapeModel = Prop(c.tapeDescriptor, kAAFPropID_TapeDescriptor_Model, L"Model", t.string, true);
         p.tapeLength = Prop(c.tapeDescriptor, kAAFPropID_TapeDescriptor_TapeLength, L"TapeLength", t.uint32, true);
-        p.networkURLString =
-            Prop(c.networkLocator, kAAFPropID_NetworkLocator_URLString, L"URLString", t.string, false);
+        p.networkURLString = Prop(c.networkLocator, kAAFPropID_NetworkLocator_URLString, L"URLString", t.string, false);
     }
 
     void DataDefinitions() {

@@ -1,13 +1,13 @@
 #include "ClassDefinition.h"
 
+#include "Enumerator.h"
 #include "Guard.h"
 #include "InternalIDs.h"
 #include "ModelObject.h"
 #include "PropertyDefinition.h"
-#include "Enumerator.h"
-#include "aaf/IEnumAAFPropertyDefs.h"
 #include "Schema.h"
 #include "TypeDefinition.h"
+#include "aaf/IEnumAAFPropertyDefs.h"
 
 namespace aafmodel {
 

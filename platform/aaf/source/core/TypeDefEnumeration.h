@@ -23,8 +23,8 @@ public:
     size_t Alignment() const override { return NativeSize(); }
 
     using MetaDefinitionBase::Initialize;
-    AAFRESULT Initialize(aafUID_constref id, IAAFTypeDef* pType, aafInt64* pElementValues,
-                         aafString_t* pElementNames, aafUInt32 numElems, aafCharacter_constptr pTypeName) override;
+    AAFRESULT Initialize(aafUID_constref id, IAAFTypeDef* pType, aafInt64* pElementValues, aafString_t* pElementNames,
+                         aafUInt32 numElems, aafCharacter_constptr pTypeName) override;
     AAFRESULT CreateValueFromName(aafCharacter_constptr Name, IAAFPropertyValue** ppPropVal) override;
     AAFRESULT GetElementType(IAAFTypeDef** ppTypeDef) override;
     AAFRESULT GetElementValue(aafUInt32 index, aafInt64* pOutValue) override;

@@ -7,8 +7,7 @@ namespace aafmodel {
 
 class TypeDefFixedArrayType final : public TypeDefFace<IAAFTypeDef> {
 public:
-    TypeDefFixedArrayType(Schema& schema, const aafUID_t& id, std::wstring name, TypeDefinition& element,
-                          size_t count)
+    TypeDefFixedArrayType(Schema& schema, const aafUID_t& id, std::wstring name, TypeDefinition& element, size_t count)
         : TypeDefFace(schema, id, std::move(name), kAAFTypeCatFixedArray), m_element(element), m_count(count) {}
 
     size_t NativeSize() const override { return m_element.NativeSize() * m_count; }

@@ -135,8 +135,7 @@ AAFRESULT TypeDefRecordType::GetStruct(IAAFPropertyValue* pPropVal, aafMemPtr_t 
     });
 }
 
-AAFRESULT TypeDefRecordType::SetValue(IAAFPropertyValue* pPropVal, aafUInt32 index,
-                                      IAAFPropertyValue* pMemberPropVal) {
+AAFRESULT TypeDefRecordType::SetValue(IAAFPropertyValue* pPropVal, aafUInt32 index, IAAFPropertyValue* pMemberPropVal) {
     return Guarded([&] {
         PutMember(ValueOf(pPropVal), index, pMemberPropVal);
         return AAFRESULT_SUCCESS;

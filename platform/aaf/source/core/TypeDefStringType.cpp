@@ -5,8 +5,7 @@
 
 namespace aafmodel {
 
-TypeDefStringType::TypeDefStringType(Schema& schema, const aafUID_t& id, std::wstring name,
-                                     TypeDefinition* elementType)
+TypeDefStringType::TypeDefStringType(Schema& schema, const aafUID_t& id, std::wstring name, TypeDefinition* elementType)
     : TypeDefFace(schema, id, std::move(name), kAAFTypeCatString), m_elementType(elementType) {}
 
 void TypeDefStringType::Store(Value& value, const aafUInt8* chars, aafUInt32 size) {

@@ -25,8 +25,7 @@ public:
     AAFRESULT GetElementValue(IAAFPropertyValue* pInPropVal, aafUInt32 index,
                               IAAFPropertyValue** ppOutPropVal) override;
     AAFRESULT GetCArray(IAAFPropertyValue* pPropVal, aafMemPtr_t pData, aafUInt32 dataSize) override;
-    AAFRESULT SetElementValue(IAAFPropertyValue* pPropVal, aafUInt32 index,
-                              IAAFPropertyValue* pMemberPropVal) override;
+    AAFRESULT SetElementValue(IAAFPropertyValue* pPropVal, aafUInt32 index, IAAFPropertyValue* pMemberPropVal) override;
     AAFRESULT SetCArray(IAAFPropertyValue* pPropVal, aafMemPtr_t pData, aafUInt32 dataSize) override;
     AAFRESULT GetElements(IAAFPropertyValue* pPropVal, IEnumAAFPropertyValues** ppEnum) override;
 

@@ -93,9 +93,7 @@ AAF_EXPORT AAFRESULT AAFFileOpenTransient(aafProductIdentification_t* pIdent, IA
 }
 
 AAF_EXPORT AAFRESULT AAFFileIsAAFFile(const aafCharacter*, aafUID_t*, aafBool*) { return AAFRESULT_NOT_IMPLEMENTED; }
-AAF_EXPORT AAFRESULT AAFRawStorageIsAAFFile(IAAFRawStorage*, aafUID_t*, aafBool*) {
-    return AAFRESULT_NOT_IMPLEMENTED;
-}
+AAF_EXPORT AAFRESULT AAFRawStorageIsAAFFile(IAAFRawStorage*, aafUID_t*, aafBool*) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAF_EXPORT AAFRESULT AAFFileIsAAFFileKind(const aafCharacter*, const aafUID_t*, aafBool*) {
     return AAFRESULT_NOT_IMPLEMENTED;
 }
@@ -108,8 +106,8 @@ AAF_EXPORT AAFRESULT AAFCreateRawStorageDisk(const aafCharacter*, aafFileExisten
                                              IAAFRawStorage**) {
     return AAFRESULT_NOT_IMPLEMENTED;
 }
-AAF_EXPORT AAFRESULT AAFCreateRawStorageCachedDisk(const aafCharacter*, aafFileExistence_t, aafFileAccess_t,
-                                                   aafUInt32, aafUInt32, IAAFRawStorage**) {
+AAF_EXPORT AAFRESULT AAFCreateRawStorageCachedDisk(const aafCharacter*, aafFileExistence_t, aafFileAccess_t, aafUInt32,
+                                                   aafUInt32, IAAFRawStorage**) {
     return AAFRESULT_NOT_IMPLEMENTED;
 }
 AAF_EXPORT AAFRESULT AAFCreateRawStorageCached(IAAFRawStorage*, aafUInt32, aafUInt32, IAAFRawStorage**) {
@@ -119,9 +117,8 @@ AAF_EXPORT AAFRESULT AAFCreateRawStorageCached2(IAAFRawStorage*, aafUInt32, aafU
                                                 IAAFRawStorage**) {
     return AAFRESULT_NOT_IMPLEMENTED;
 }
-AAF_EXPORT AAFRESULT AAFCreateAAFFileOnRawStorage(IAAFRawStorage*, aafFileExistence_t, aafFileAccess_t,
-                                                  const aafUID_t*, aafUInt32, aafProductIdentification_t*,
-                                                  IAAFFile**) {
+AAF_EXPORT AAFRESULT AAFCreateAAFFileOnRawStorage(IAAFRawStorage*, aafFileExistence_t, aafFileAccess_t, const aafUID_t*,
+                                                  aafUInt32, aafProductIdentification_t*, IAAFFile**) {
     return AAFRESULT_NOT_IMPLEMENTED;
 }
 AAF_EXPORT AAFRESULT AAFSetProgressCallback(IAAFProgress*) { return AAFRESULT_NOT_IMPLEMENTED; }

@@ -123,8 +123,7 @@ AAFRESULT DictionaryView::RegisterDataDef(IAAFDataDef* pDataDef) {
 }
 
 AAFRESULT DictionaryView::LookupDataDef(aafUID_constref dataDefinitionId, IAAFDataDef** ppDataDef) {
-    return HandDefinition(m_object.GetSchema().FindDataDef(dataDefinitionId), AAFRESULT_OBJECT_NOT_FOUND,
-                          ppDataDef);
+    return HandDefinition(m_object.GetSchema().FindDataDef(dataDefinitionId), AAFRESULT_OBJECT_NOT_FOUND, ppDataDef);
 }
 
 AAFRESULT DictionaryView::GetDataDefs(IEnumAAFDataDefs**) { return AAFRESULT_NOT_IMPLEMENTED; }
@@ -138,15 +137,11 @@ AAFRESULT DictionaryView::CountDataDefs(aafUInt32* pResult) {
 // Effects, codecs, containers, interpolations and plug-ins have no place in
 // this library: the plug-in never asks for them.
 AAFRESULT DictionaryView::RegisterOperationDef(IAAFOperationDef*) { return AAFRESULT_NOT_IMPLEMENTED; }
-AAFRESULT DictionaryView::LookupOperationDef(aafUID_constref, IAAFOperationDef**) {
-    return AAFRESULT_NOT_IMPLEMENTED;
-}
+AAFRESULT DictionaryView::LookupOperationDef(aafUID_constref, IAAFOperationDef**) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::GetOperationDefs(IEnumAAFOperationDefs**) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::CountOperationDefs(aafUInt32*) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::RegisterParameterDef(IAAFParameterDef*) { return AAFRESULT_NOT_IMPLEMENTED; }
-AAFRESULT DictionaryView::LookupParameterDef(aafUID_constref, IAAFParameterDef**) {
-    return AAFRESULT_NOT_IMPLEMENTED;
-}
+AAFRESULT DictionaryView::LookupParameterDef(aafUID_constref, IAAFParameterDef**) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::GetParameterDefs(IEnumAAFParameterDefs**) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::CountParameterDefs(aafUInt32*) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::RegisterCodecDef(IAAFCodecDef*) { return AAFRESULT_NOT_IMPLEMENTED; }
@@ -154,9 +149,7 @@ AAFRESULT DictionaryView::LookupCodecDef(aafUID_constref, IAAFCodecDef**) { retu
 AAFRESULT DictionaryView::GetCodecDefs(IEnumAAFCodecDefs**) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::CountCodecDefs(aafUInt32*) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::RegisterContainerDef(IAAFContainerDef*) { return AAFRESULT_NOT_IMPLEMENTED; }
-AAFRESULT DictionaryView::LookupContainerDef(aafUID_constref, IAAFContainerDef**) {
-    return AAFRESULT_NOT_IMPLEMENTED;
-}
+AAFRESULT DictionaryView::LookupContainerDef(aafUID_constref, IAAFContainerDef**) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::GetContainerDefs(IEnumAAFContainerDefs**) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::CountContainerDefs(aafUInt32*) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DictionaryView::RegisterInterpolationDef(IAAFInterpolationDef*) { return AAFRESULT_NOT_IMPLEMENTED; }

@@ -58,14 +58,14 @@ AAFRESULT DigitalImageDescriptorView::SetImageAspectRatio(aafRational_t ImageAsp
 AAFRESULT DigitalImageDescriptorView::GetImageAspectRatio(aafRational_t* pImageAspectRatio) {
     return GetBuiltin(m_object, &P::imageAspectRatio, pImageAspectRatio);
 }
-AAFRESULT DigitalImageDescriptorView::SetAlphaTransparency(aafAlphaTransparency_t) {
-    return AAFRESULT_NOT_IMPLEMENTED;
-}
+AAFRESULT DigitalImageDescriptorView::SetAlphaTransparency(aafAlphaTransparency_t) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT DigitalImageDescriptorView::GetAlphaTransparency(aafAlphaTransparency_t*) {
     return AAFRESULT_NOT_IMPLEMENTED;
 }
 AAFRESULT DigitalImageDescriptorView::SetGamma(aafUID_t Gamma) { return SetBuiltin(m_object, &P::imageGamma, Gamma); }
-AAFRESULT DigitalImageDescriptorView::GetGamma(aafUID_t* pGamma) { return GetBuiltin(m_object, &P::imageGamma, pGamma); }
+AAFRESULT DigitalImageDescriptorView::GetGamma(aafUID_t* pGamma) {
+    return GetBuiltin(m_object, &P::imageGamma, pGamma);
+}
 AAFRESULT DigitalImageDescriptorView::SetImageAlignmentFactor(aafUInt32 ImageAlignmentFactor) {
     return SetBuiltin(m_object, &P::imageAlignmentFactor, ImageAlignmentFactor);
 }

@@ -26,19 +26,19 @@ AAFRESULT IdentificationView::Initialize(aafCharacter_constptr companyName, aafC
     });
 }
 
-#define STRING_GETTERS(Name, prop)                                                              \
-    AAFRESULT IdentificationView::Get##Name(aafCharacter* p, aafUInt32 bufSize) {               \
-        return Guarded([&] {                                                                    \
-            CopyStringProperty(m_object, *Builtins(m_object).p.prop, p, bufSize);               \
-            return AAFRESULT_SUCCESS;                                                           \
-        });                                                                                     \
-    }                                                                                           \
-    AAFRESULT IdentificationView::Get##Name##BufLen(aafUInt32* pBufSize) {                      \
-        return Guarded([&] {                                                                    \
-            Require(pBufSize);                                                                  \
-            *pBufSize = StringPropertyBufLen(m_object, *Builtins(m_object).p.prop);             \
-            return AAFRESULT_SUCCESS;                                                           \
-        });                                                                                     \
+#define STRING_GETTERS(Name, prop)                                                  \
+    AAFRESULT IdentificationView::Get##Name(aafCharacter* p, aafUInt32 bufSize) {   \
+        return Guarded([&] {                                                        \
+            CopyStringProperty(m_object, *Builtins(m_object).p.prop, p, bufSize);   \
+            return AAFRESULT_SUCCESS;                                               \
+        });                                                                         \
+    }                                                                               \
+    AAFRESULT IdentificationView::Get##Name##BufLen(aafUInt32* pBufSize) {          \
+        return Guarded([&] {                                                        \
+            Require(pBufSize);                                                      \
+            *pBufSize = StringPropertyBufLen(m_object, *Builtins(m_object).p.prop); \
+            return AAFRESULT_SUCCESS;                                               \
+        });                                                                         \
     }
 
 STRING_GETTERS(CompanyName, identCompanyName)

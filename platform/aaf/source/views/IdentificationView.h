@@ -9,7 +9,8 @@ class IdentificationView final : public View<IAAFIdentification> {
 public:
     using View::View;
 
-    AAFRESULT Initialize(aafCharacter_constptr companyName, aafCharacter_constptr productName, aafCharacter_constptr productVersionString, aafUID_constref productID) override;
+    AAFRESULT Initialize(aafCharacter_constptr companyName, aafCharacter_constptr productName,
+                         aafCharacter_constptr productVersionString, aafUID_constref productID) override;
     AAFRESULT GetCompanyName(aafCharacter* pCompanyName, aafUInt32 bufSize) override;
     AAFRESULT GetCompanyNameBufLen(aafUInt32* pBufSize) override;
     AAFRESULT GetProductName(aafCharacter* pProductName, aafUInt32 bufSize) override;

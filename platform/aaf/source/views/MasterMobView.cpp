@@ -44,9 +44,7 @@ AAFRESULT MasterMobView::AddMasterSlot(IAAFDataDef* pDataDef, aafSlotID_t source
 AAFRESULT MasterMobView::GetTapeName(aafUInt32, aafCharacter*, aafUInt32) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT MasterMobView::GetTapeNameBufLen(aafUInt32, aafUInt32*) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT MasterMobView::GetNumRepresentations(aafSlotID_t, aafNumSlots_t*) { return AAFRESULT_NOT_IMPLEMENTED; }
-AAFRESULT MasterMobView::GetRepresentation(aafSlotID_t, aafUInt32, IAAFSegment**) {
-    return AAFRESULT_NOT_IMPLEMENTED;
-}
+AAFRESULT MasterMobView::GetRepresentation(aafSlotID_t, aafUInt32, IAAFSegment**) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT MasterMobView::GetCriteriaSegment(aafSlotID_t, aafMediaCriteria_t*, IAAFSegment**) {
     return AAFRESULT_NOT_IMPLEMENTED;
 }

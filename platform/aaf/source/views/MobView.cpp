@@ -6,9 +6,9 @@
 #include "MobSlots.h"
 #include "TaggedValueList.h"
 #include "ViewSupport.h"
+#include "aaf/IAAFEventMobSlot.h"
 #include "aaf/IAAFMobSlot.h"
 #include "aaf/IAAFTimelineMobSlot.h"
-#include "aaf/IAAFEventMobSlot.h"
 #include "aaf/IEnumAAFMobSlots.h"
 
 namespace aafmodel {
@@ -192,9 +192,7 @@ AAFRESULT MobView::LookupSlot(aafSlotID_t slotId, IAAFMobSlot** ppDestSlot) {
 }
 
 AAFRESULT MobView::ChangeRef(aafMobID_constref, aafMobID_constref) { return AAFRESULT_NOT_IMPLEMENTED; }
-AAFRESULT MobView::CloneExternal(aafDepend_t, aafIncMedia_t, IAAFFile*, IAAFMob**) {
-    return AAFRESULT_NOT_IMPLEMENTED;
-}
+AAFRESULT MobView::CloneExternal(aafDepend_t, aafIncMedia_t, IAAFFile*, IAAFMob**) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT MobView::Copy(aafCharacter_constptr, IAAFMob**) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT MobView::AppendKLVData(IAAFKLVData*) { return AAFRESULT_NOT_IMPLEMENTED; }
 AAFRESULT MobView::CountKLVData(aafUInt32* pNumData) {

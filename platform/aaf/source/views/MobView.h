@@ -29,12 +29,16 @@ public:
     AAFRESULT CountComments(aafUInt32* pNumComments) override;
     AAFRESULT GetComments(IEnumAAFTaggedValues** ppEnum) override;
     AAFRESULT RemoveComment(IAAFTaggedValue* pComment) override;
-    AAFRESULT AppendNewTimelineSlot(aafRational_t editRate, IAAFSegment* pSegment, aafSlotID_t slotID, aafCharacter_constptr pSlotName, aafPosition_t origin, IAAFTimelineMobSlot** ppNewSlot) override;
-    AAFRESULT GetMobInfo(aafTimeStamp_t* pLastModified, aafTimeStamp_t* pCreationTime, aafCharacter* pName, aafInt32 bufSize) override;
+    AAFRESULT AppendNewTimelineSlot(aafRational_t editRate, IAAFSegment* pSegment, aafSlotID_t slotID,
+                                    aafCharacter_constptr pSlotName, aafPosition_t origin,
+                                    IAAFTimelineMobSlot** ppNewSlot) override;
+    AAFRESULT GetMobInfo(aafTimeStamp_t* pLastModified, aafTimeStamp_t* pCreationTime, aafCharacter* pName,
+                         aafInt32 bufSize) override;
     AAFRESULT OffsetToMobTimecode(IAAFSegment* pTcSeg, aafPosition_t* pOffset, aafTimecode_t* pResult) override;
     AAFRESULT LookupSlot(aafSlotID_t slotId, IAAFMobSlot** ppDestSlot) override;
     AAFRESULT ChangeRef(aafMobID_constref oldMobID, aafMobID_constref newMobID) override;
-    AAFRESULT CloneExternal(aafDepend_t resolveDependencies, aafIncMedia_t includeMedia, IAAFFile* pDestFile, IAAFMob** ppDestMob) override;
+    AAFRESULT CloneExternal(aafDepend_t resolveDependencies, aafIncMedia_t includeMedia, IAAFFile* pDestFile,
+                            IAAFMob** ppDestMob) override;
     AAFRESULT Copy(aafCharacter_constptr pDestMobName, IAAFMob** ppDestMob) override;
     AAFRESULT AppendKLVData(IAAFKLVData* pData) override;
     AAFRESULT CountKLVData(aafUInt32* pNumData) override;
@@ -46,8 +50,11 @@ public:
     AAFRESULT RemoveAttribute(IAAFTaggedValue* pAttribute) override;
     AAFRESULT SetUsageCode(aafUID_constref usageCode) override;
     AAFRESULT GetUsageCode(aafUID_t* pUsageCode) override;
-    AAFRESULT AppendNewStaticSlot(IAAFSegment* pSegment, aafSlotID_t slotID, aafCharacter_constptr pSlotName, IAAFStaticMobSlot** ppNewSlot) override;
-    AAFRESULT AppendNewEventSlot(aafRational_t editRate, IAAFSegment* pSegment, aafSlotID_t slotID, aafCharacter_constptr pSlotName, aafPosition_t origin, IAAFEventMobSlot** ppNewSlot) override;
+    AAFRESULT AppendNewStaticSlot(IAAFSegment* pSegment, aafSlotID_t slotID, aafCharacter_constptr pSlotName,
+                                  IAAFStaticMobSlot** ppNewSlot) override;
+    AAFRESULT AppendNewEventSlot(aafRational_t editRate, IAAFSegment* pSegment, aafSlotID_t slotID,
+                                 aafCharacter_constptr pSlotName, aafPosition_t origin,
+                                 IAAFEventMobSlot** ppNewSlot) override;
 };
 
 }  // namespace aafmodel

@@ -10,7 +10,8 @@ public:
     using View::View;
 
     AAFRESULT SegmentOffsetToTC(aafPosition_t* pOffset, aafTimecode_t* pTimecode, aafBool* pFound) override;
-    AAFRESULT SegmentTCToOffset(aafTimecode_t* pTimecode, aafRational_t* pEditRate, aafFrameOffset_t* pOffset, aafBool* pFound) override;
+    AAFRESULT SegmentTCToOffset(aafTimecode_t* pTimecode, aafRational_t* pEditRate, aafFrameOffset_t* pOffset,
+                                aafBool* pFound) override;
 };
 
 }  // namespace aafmodel

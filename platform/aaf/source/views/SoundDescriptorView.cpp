@@ -30,7 +30,9 @@ AAFRESULT SoundDescriptorView::GetAudioSamplingRate(aafRational_t* pRate) {
 AAFRESULT SoundDescriptorView::SetIsLocked(aafBoolean_t locked) {
     return SetBuiltin(m_object, &P::soundLocked, locked ? kAAFTrue : kAAFFalse);
 }
-AAFRESULT SoundDescriptorView::IsLocked(aafBoolean_t* pLocked) { return GetBuiltin(m_object, &P::soundLocked, pLocked); }
+AAFRESULT SoundDescriptorView::IsLocked(aafBoolean_t* pLocked) {
+    return GetBuiltin(m_object, &P::soundLocked, pLocked);
+}
 AAFRESULT SoundDescriptorView::SetElectroSpatialFormulation(aafElectroSpatialFormulation_t formulation) {
     return SetBuiltin(m_object, &P::soundElectroSpatial, formulation);
 }

@@ -42,8 +42,8 @@ AAFRESULT SourceMobView::AddNilReference(aafSlotID_t slotID, aafLength_t length,
 AAFRESULT SourceMobView::AppendTimecodeSlot(aafRational_t, aafInt32, aafTimecode_t, aafFrameLength_t) {
     return AAFRESULT_NOT_IMPLEMENTED;
 }
-AAFRESULT SourceMobView::AppendEdgecodeSlot(aafRational_t, aafInt32, aafFrameOffset_t, aafFrameLength_t,
-                                            aafFilmType_t, aafEdgeType_t, aafEdgecode_t) {
+AAFRESULT SourceMobView::AppendEdgecodeSlot(aafRational_t, aafInt32, aafFrameOffset_t, aafFrameLength_t, aafFilmType_t,
+                                            aafEdgeType_t, aafEdgecode_t) {
     return AAFRESULT_NOT_IMPLEMENTED;
 }
 AAFRESULT SourceMobView::SpecifyValidCodeRange(IAAFDataDef*, aafSlotID_t, aafRational_t, aafFrameOffset_t,

@@ -17,9 +17,8 @@ void AppendTaggedString(ModelObject& owner, const PropertyDefinition& list, aafC
     tagged->SetString(*b.p.taggedValueName, name);
     const std::wstring text(value);
     auto* indirect = static_cast<TypeDefIndirectType*>(b.t.indirect);
-    tagged->Assign(*b.p.taggedValueValue,
-                   indirect->Wrap(*b.t.string, reinterpret_cast<const aafUInt8*>(text.c_str()),
-                                  (text.size() + 1) * sizeof(aafCharacter)));
+    tagged->Assign(*b.p.taggedValueValue, indirect->Wrap(*b.t.string, reinterpret_cast<const aafUInt8*>(text.c_str()),
+                                                         (text.size() + 1) * sizeof(aafCharacter)));
     const auto* existing = owner.FindVector(list);
     owner.InsertInto(list, existing ? existing->size() : 0, *tagged);
 }

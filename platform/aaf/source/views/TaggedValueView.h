@@ -9,7 +9,8 @@ class TaggedValueView final : public View<IAAFTaggedValue> {
 public:
     using View::View;
 
-    AAFRESULT Initialize(aafCharacter_constptr pName, IAAFTypeDef* pTypeDef, aafUInt32 valueSize, aafDataBuffer_t pValue) override;
+    AAFRESULT Initialize(aafCharacter_constptr pName, IAAFTypeDef* pTypeDef, aafUInt32 valueSize,
+                         aafDataBuffer_t pValue) override;
     AAFRESULT GetName(aafCharacter* pName, aafUInt32 bufSize) override;
     AAFRESULT GetNameBufLen(aafUInt32* pLen) override;
     AAFRESULT GetTypeDefinition(IAAFTypeDef** ppTypeDef) override;

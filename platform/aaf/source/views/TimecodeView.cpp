@@ -22,7 +22,8 @@ AAFRESULT TimecodeView::Initialize(aafLength_t length, aafTimecode_t* pTimecode)
         const BuiltinDefinitions& b = Builtins(m_object);
         Store(m_object, *pTimecode);
         m_object.SetFixed(*b.p.componentLength, length);
-        if (DataDefinition* def = m_object.GetSchema().FindDataDef(kAAFDataDef_Timecode)) SetDataDefinition(m_object, *def);
+        if (DataDefinition* def = m_object.GetSchema().FindDataDef(kAAFDataDef_Timecode))
+            SetDataDefinition(m_object, *def);
         return AAFRESULT_SUCCESS;
     });
 }

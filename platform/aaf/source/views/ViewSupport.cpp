@@ -2,8 +2,8 @@
 
 #include <chrono>
 #include <cstring>
-#include <random>
 #include <ctime>
+#include <random>
 
 #include "../core/ClassDefinition.h"
 #include "../core/DataDefinition.h"

@@ -42,10 +42,10 @@ TOV_EXPORT TOVRESULT TOVRegisterPlugin(ITOVUnknown* host, ITOVPluginDefinition**
         TOVPtr<ITOVComponentFactory> factory;
         TOVCheck(host->QueryInterface(IID_ITOVComponentFactory, factory.Out()));
         TOVPtr<ITOVPluginDefinition> definition;
-        TOVCheck(factory->CreateComponent(TOVCompID_PluginDefinition, nullptr, IID_ITOVPluginDefinition,
-                                          definition.Out()));
-        TOVCheck(definition->Initialize(TestModulePluginID, 2, 3, L"Test Module", TestModuleVendorID, L"Test Vendor",
-                                        1, 1));
+        TOVCheck(
+            factory->CreateComponent(TOVCompID_PluginDefinition, nullptr, IID_ITOVPluginDefinition, definition.Out()));
+        TOVCheck(
+            definition->Initialize(TestModulePluginID, 2, 3, L"Test Module", TestModuleVendorID, L"Test Vendor", 1, 1));
         *out = definition.Detach();
         return TOV_OK;
     });
@@ -61,8 +61,8 @@ TOV_EXPORT TOVRESULT TOVRegisterComponent(ITOVUnknown* host, unsigned int index,
         TOVPtr<ITOVComponentDefinition> definition;
         TOVCheck(factory->CreateComponent(TOVCompID_ComponentDefinition, nullptr, IID_ITOVComponentDefinition,
                                           definition.Out()));
-        TOVCheck(definition->Initialize(CompID_TestEcho, TOVCompType_OrrinMediaAccess, 2, 3, CLSID_TestEcho,
-                                        L"TestEcho"));
+        TOVCheck(
+            definition->Initialize(CompID_TestEcho, TOVCompType_OrrinMediaAccess, 2, 3, CLSID_TestEcho, L"TestEcho"));
         *out = definition.Detach();
         return TOV_OK;
     });

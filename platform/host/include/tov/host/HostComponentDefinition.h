@@ -5,7 +5,8 @@
 #include "tov/ITOVComponentDefinition.h"
 #include "tov/host/HostDefinition.h"
 
-inline constexpr _tovUID CLSID_HostComponentDefinition = {0x00905627, 0x6EBA, 0x4AD8, {0xA7, 0xD7, 0x82, 0x6D, 0x2C, 0x2B, 0xD4, 0xB5}};
+inline constexpr _tovUID CLSID_HostComponentDefinition = {
+    0x00905627, 0x6EBA, 0x4AD8, {0xA7, 0xD7, 0x82, 0x6D, 0x2C, 0x2B, 0xD4, 0xB5}};
 
 class HostComponentDefinition : public HostDefinition<ITOVComponentDefinition> {
 public:

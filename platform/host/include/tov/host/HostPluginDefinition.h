@@ -5,7 +5,8 @@
 #include "tov/ITOVPluginDefinition.h"
 #include "tov/host/HostDefinition.h"
 
-inline constexpr _tovUID CLSID_HostPluginDefinition = {0xBA8ECAE5, 0xE1C4, 0x4FCF, {0x98, 0xCF, 0x17, 0xE1, 0x92, 0x77, 0x4A, 0x8D}};
+inline constexpr _tovUID CLSID_HostPluginDefinition = {
+    0xBA8ECAE5, 0xE1C4, 0x4FCF, {0x98, 0xCF, 0x17, 0xE1, 0x92, 0x77, 0x4A, 0x8D}};
 
 class HostPluginDefinition : public HostDefinition<ITOVPluginDefinition> {
 public:

@@ -8,7 +8,8 @@
 #include "tov/sdk/CTOVUnknown.h"
 #include "tov/sdk/TOVPtr.h"
 
-inline constexpr _tovUID CLSID_HostXmlSaxParser = {0xD3952F8C, 0xC059, 0x4AAF, {0x8B, 0x43, 0x70, 0xAB, 0x30, 0x29, 0xD6, 0x1E}};
+inline constexpr _tovUID CLSID_HostXmlSaxParser = {
+    0xD3952F8C, 0xC059, 0x4AAF, {0x8B, 0x43, 0x70, 0xAB, 0x30, 0x29, 0xD6, 0x1E}};
 
 class HostXmlSaxParser : public UTIL::ITOVXmlSaxParser, public CTOVUnknown {
 public:
@@ -29,8 +30,8 @@ private:
     static void OnStartDocument(void* self);
     static void OnEndDocument(void* self);
     static void OnStartElement(void* self, const xmlChar* localName, const xmlChar* prefix, const xmlChar* uri,
-                               int namespaceCount, const xmlChar** namespaces, int attributeCount,
-                               int defaultedCount, const xmlChar** attributes);
+                               int namespaceCount, const xmlChar** namespaces, int attributeCount, int defaultedCount,
+                               const xmlChar** attributes);
     static void OnEndElement(void* self, const xmlChar*, const xmlChar*, const xmlChar*);
     static void OnCharacters(void* self, const xmlChar* text, int length);
     static void OnEntityDeclaration(void* self, const xmlChar*, int, const xmlChar*, const xmlChar*, xmlChar*);

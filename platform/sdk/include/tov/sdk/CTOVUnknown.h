@@ -57,9 +57,9 @@ private:
 
 /// Public ITOVUnknown slots of a concrete component: they forward unconditionally
 /// to the controlling unknown, so a component never counts in its public slots.
-#define TOV_FORWARD_UNKNOWN                                                              \
-    TOVRESULT QueryInterface(const _tovUID& iid, void** out) override {                  \
-        return CTOVUnknown::GetControllingUnknown()->QueryInterface(iid, out);           \
-    }                                                                                    \
+#define TOV_FORWARD_UNKNOWN                                                               \
+    TOVRESULT QueryInterface(const _tovUID& iid, void** out) override {                   \
+        return CTOVUnknown::GetControllingUnknown()->QueryInterface(iid, out);            \
+    }                                                                                     \
     uint32_t AddRef() override { return CTOVUnknown::GetControllingUnknown()->AddRef(); } \
     uint32_t Release() override { return CTOVUnknown::GetControllingUnknown()->Release(); }

@@ -12,15 +12,15 @@ namespace Chunks {
 namespace IXML {
 
 // Get, Set, Has and SetHas of one value and its flag.
-#define IXML_DATA_FIELD(Type, Name)                        \
-public:                                                    \
-    const Type& Get##Name() const { return m_##Name; }     \
+#define IXML_DATA_FIELD(Type, Name)                         \
+public:                                                     \
+    const Type& Get##Name() const { return m_##Name; }      \
     void Set##Name(const Type& value) { m_##Name = value; } \
-    bool Has##Name() const { return m_Has##Name; }         \
-    void SetHas##Name(bool has) { m_Has##Name = has; }     \
-                                                           \
-private:                                                   \
-    Type m_##Name{};                                       \
+    bool Has##Name() const { return m_Has##Name; }          \
+    void SetHas##Name(bool has) { m_Has##Name = has; }      \
+                                                            \
+private:                                                    \
+    Type m_##Name{};                                        \
     bool m_Has##Name = false;
 
 class IXMLData {

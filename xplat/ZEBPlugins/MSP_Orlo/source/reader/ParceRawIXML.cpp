@@ -135,12 +135,14 @@ void ReadSpeed(ZEBXmlElement* root, IXMLData& data) {
     }
 
     uint32_t digitizer = 0;
-    if (ZEBXmlElement* e = Child(element, E::DIGITIZER_SAMPLE_RATE); e && IntegerFromZEBString(e->GetText(), digitizer)) {
+    if (ZEBXmlElement* e = Child(element, E::DIGITIZER_SAMPLE_RATE);
+        e && IntegerFromZEBString(e->GetText(), digitizer)) {
         speed.SetDigitizerSampleRate(digitizer);
         speed.SetHasDigitizerSampleRate(true);
     }
     uint32_t stampRate = 0;
-    if (ZEBXmlElement* e = Child(element, E::TIMESTAMP_SAMPLE_RATE); e && IntegerFromZEBString(e->GetText(), stampRate)) {
+    if (ZEBXmlElement* e = Child(element, E::TIMESTAMP_SAMPLE_RATE);
+        e && IntegerFromZEBString(e->GetText(), stampRate)) {
         speed.SetTimeStampSampleRate(stampRate);
         speed.SetHasTimeStampSampleRate(true);
     }

@@ -95,8 +95,7 @@ AAFRESULT AAFDLL::Load(const char* dllname) {
     // Raw storage comes as a whole or not at all.
     if (AAFRESULT_SUCCEEDED(Resolve(h, "AAFCreateRawStorageMemory", _pfnCreateRawStorageMemory))) {
         if (AAFRESULT_FAILED(r = Resolve(h, "AAFCreateRawStorageDisk", _pfnCreateRawStorageDisk))) return r;
-        if (AAFRESULT_FAILED(r = Resolve(h, "AAFCreateAAFFileOnRawStorage", _pfnCreateAAFFileOnRawStorage)))
-            return r;
+        if (AAFRESULT_FAILED(r = Resolve(h, "AAFCreateAAFFileOnRawStorage", _pfnCreateAAFFileOnRawStorage))) return r;
     }
     Resolve(h, "AAFSetProgressCallback", _pfnSetProgressCallback);
     Resolve(h, "AAFCreateRawStorageCachedDisk", _pfnCreateRawStorageCachedDisk);
@@ -127,8 +126,7 @@ AAFRESULT AAFDLL::Unload() {
 AAFRESULT AAFDLL::OpenExistingRead(const aafCharacter* a, aafUInt32 b, IAAFFile** c) {
     return _pfnOpenExistingRead(a, b, c);
 }
-AAFRESULT AAFDLL::OpenExistingModify(const aafCharacter* a, aafUInt32 b, aafProductIdentification_t* c,
-                                     IAAFFile** d) {
+AAFRESULT AAFDLL::OpenExistingModify(const aafCharacter* a, aafUInt32 b, aafProductIdentification_t* c, IAAFFile** d) {
     return _pfnOpenExistingModify(a, b, c, d);
 }
 AAFRESULT AAFDLL::OpenNewModify(const aafCharacter* a, aafUInt32 b, aafProductIdentification_t* c, IAAFFile** d) {
@@ -143,17 +141,16 @@ AAFRESULT AAFDLL::IsAAFFile(const aafCharacter* a, aafUID_t* b, aafBool* c) {
     return result == AAFRESULT_NOT_IMPLEMENTED ? AAFRESULT_DLL_SYMBOL_NOT_FOUND : result;
 }
 
-#define AAFDLL_OPTIONAL(Member, Pointer, Params, Args)                     \
-    AAFRESULT AAFDLL::Member Params {                                      \
-        if (!Pointer) return AAFRESULT_DLL_SYMBOL_NOT_FOUND;               \
-        return Pointer Args;                                               \
+#define AAFDLL_OPTIONAL(Member, Pointer, Params, Args)       \
+    AAFRESULT AAFDLL::Member Params {                        \
+        if (!Pointer) return AAFRESULT_DLL_SYMBOL_NOT_FOUND; \
+        return Pointer Args;                                 \
     }
 
 AAFDLL_OPTIONAL(OpenNewModifyEx, _pfnOpenNewModifyEx,
                 (const aafCharacter* a, const aafUID_t* b, aafUInt32 c, aafProductIdentification_t* d, IAAFFile** e),
                 (a, b, c, d, e))
-AAFDLL_OPTIONAL(RawStorageIsAAFFile, _pfnRawStorageIsAAFFile, (IAAFRawStorage * a, aafUID_t* b, aafBool* c),
-                (a, b, c))
+AAFDLL_OPTIONAL(RawStorageIsAAFFile, _pfnRawStorageIsAAFFile, (IAAFRawStorage * a, aafUID_t* b, aafBool* c), (a, b, c))
 AAFDLL_OPTIONAL(FileIsAAFFileKind, _pfnFileIsAAFFileKind, (const aafCharacter* a, const aafUID_t* b, aafBool* c),
                 (a, b, c))
 AAFDLL_OPTIONAL(RawStorageIsAAFFileKind, _pfnRawStorageIsAAFFileKind,

@@ -25,8 +25,8 @@ public:
     bool HasHandle() const { return _libHandle != nullptr; }
 
     AAFRESULT OpenExistingRead(const aafCharacter* pFileName, aafUInt32 modeFlags, IAAFFile** ppFile);
-    AAFRESULT OpenExistingModify(const aafCharacter* pFileName, aafUInt32 modeFlags,
-                                 aafProductIdentification_t* pIdent, IAAFFile** ppFile);
+    AAFRESULT OpenExistingModify(const aafCharacter* pFileName, aafUInt32 modeFlags, aafProductIdentification_t* pIdent,
+                                 IAAFFile** ppFile);
     AAFRESULT OpenNewModify(const aafCharacter* pFileName, aafUInt32 modeFlags, aafProductIdentification_t* pIdent,
                             IAAFFile** ppFile);
     AAFRESULT OpenNewModifyEx(const aafCharacter* pFileName, const aafUID_t* pFileKind, aafUInt32 modeFlags,
@@ -35,8 +35,7 @@ public:
     AAFRESULT IsAAFFile(const aafCharacter* pFileName, aafUID_t* pAAFFileKind, aafBool* pFileIsAAFFile);
     AAFRESULT RawStorageIsAAFFile(IAAFRawStorage* pRawStorage, aafUID_t* pAAFFileKind, aafBool* pIsAAFFile);
     AAFRESULT FileIsAAFFileKind(const aafCharacter* pFileName, const aafUID_t* pAAFFileKind, aafBool* pIsAAFFile);
-    AAFRESULT RawStorageIsAAFFileKind(IAAFRawStorage* pRawStorage, const aafUID_t* pAAFFileKind,
-                                      aafBool* pIsAAFFile);
+    AAFRESULT RawStorageIsAAFFileKind(IAAFRawStorage* pRawStorage, const aafUID_t* pAAFFileKind, aafBool* pIsAAFFile);
     AAFRESULT GetPluginManager(IAAFPluginManager** ppPluginManager);
     AAFRESULT CreateRawStorageMemory(aafFileAccess_t access, IAAFRawStorage** ppNewRawStorage);
     AAFRESULT CreateRawStorageDisk(const aafCharacter* pFilename, aafFileExistence_t existence, aafFileAccess_t access,

@@ -132,11 +132,11 @@ TOVRESULT InsertSequenceToTimelineMobSlot(IAAFDictionary* dictionary, IAAFMobSlo
         AAFComPtr<IAAFSegment> segment;
         Check(slot->GetSegment(segment.out()));
         AAFComPtr<IAAFSequence> existing;
-        if (AAFRESULT_SUCCEEDED(Use(segment)->QueryInterface(IID_IAAFSequence, reinterpret_cast<void**>(existing.out()))))
+        if (AAFRESULT_SUCCEEDED(
+                Use(segment)->QueryInterface(IID_IAAFSequence, reinterpret_cast<void**>(existing.out()))))
             return;
         AAFComPtr<IAAFClassDef> cls;
-        if (AAFRESULT_FAILED(dictionary->LookupClassDef(AUID_AAFSequence, cls.out())))
-            throw "AAFRESULT_SUCCEEDED (hr)";
+        if (AAFRESULT_FAILED(dictionary->LookupClassDef(AUID_AAFSequence, cls.out()))) throw "AAFRESULT_SUCCEEDED (hr)";
         AAFComPtr<IAAFSequence> sequence;
         Check(cls->CreateInstance(IID_IAAFSequence, reinterpret_cast<IUnknown**>(sequence.out())));
         auto component = QueryOrThrow<IAAFComponent>(segment.get());
@@ -179,8 +179,7 @@ TOVRESULT InitializeOrrinBoundsBoxType(IAAFDictionary* dictionary, IAAFTypeDef* 
     return Guarded([&] {
         auto rational = LookupType(dictionary, kAAFTypeID_Rational);
         IAAFTypeDef* types[4] = {rational.get(), rational.get(), rational.get(), rational.get()};
-        aafCharacter positionX[] = L"PositionX", positionY[] = L"PositionY", width[] = L"Width",
-                     height[] = L"Height";
+        aafCharacter positionX[] = L"PositionX", positionY[] = L"PositionY", width[] = L"Width", height[] = L"Height";
         aafString_t names[4] = {positionX, positionY, width, height};
         auto record = QueryOrThrow<IAAFTypeDefRecord>(typeDef);
         Check(record->Initialize(kAAFTypeID_OrrinBoundsBox, types, names, 4, L"BoundsBox"));
@@ -201,8 +200,8 @@ TOVRESULT PutBoxToAAF(const aafUID_t& propertyId, const wchar_t* name, IAAFClass
 }
 }  // namespace
 
-TOVRESULT PutBoxesToAAF(IAAFDictionary* dictionary, IAAFDigitalImageDescriptor* descriptor,
-                        aafBoundsBox_t& essenceBox, aafBoundsBox_t& sourceBox, aafBoundsBox_t& validBox) {
+TOVRESULT PutBoxesToAAF(IAAFDictionary* dictionary, IAAFDigitalImageDescriptor* descriptor, aafBoundsBox_t& essenceBox,
+                        aafBoundsBox_t& sourceBox, aafBoundsBox_t& validBox) {
     return Guarded([&] {
         if (!dictionary) throw static_cast<int>(TOV_E_POINTER);
         AAFComPtr<IAAFTypeDef> type;

@@ -43,8 +43,7 @@ TOVRESULT SetContainerHandlerGUID(IAAFDictionary* dictionary, IAAFEssenceDescrip
 TOVRESULT SetMediaAccessKind(IAAFDictionary* dictionary, IAAFFileDescriptor* descriptor, unsigned int kind);
 /// `order` must be a known element of the scanning direction enumeration.
 TOVRESULT SetBufferFillOrder(IAAFDictionary* dictionary, IAAFDigitalImageDescriptor* descriptor, int order);
-TOVRESULT SetImageRotation(IAAFDictionary* dictionary, IAAFDigitalImageDescriptor* descriptor,
-                           _aafRational_t rotation);
+TOVRESULT SetImageRotation(IAAFDictionary* dictionary, IAAFDigitalImageDescriptor* descriptor, _aafRational_t rotation);
 /// Makes the slot's segment a sequence (of the former segment) unless it is one.
 TOVRESULT InsertSequenceToTimelineMobSlot(IAAFDictionary* dictionary, IAAFMobSlot* slot);
 /// The class of `object`; throws 0x8000FFFF as an int when it cannot be told
@@ -53,8 +52,8 @@ _aafUID_t GetAAFClassID(IAAFObject* object);
 TOVRESULT RegisterOrrinBoundsBoxTypeMembers(IAAFTypeDef* typeDef);
 TOVRESULT InitializeOrrinBoundsBoxType(IAAFDictionary* dictionary, IAAFTypeDef* typeDef);
 /// Sets EssenceBox, SourceBox and ValidBox, registering the record type once per dictionary.
-TOVRESULT PutBoxesToAAF(IAAFDictionary* dictionary, IAAFDigitalImageDescriptor* descriptor,
-                        aafBoundsBox_t& essenceBox, aafBoundsBox_t& sourceBox, aafBoundsBox_t& validBox);
+TOVRESULT PutBoxesToAAF(IAAFDictionary* dictionary, IAAFDigitalImageDescriptor* descriptor, aafBoundsBox_t& essenceBox,
+                        aafBoundsBox_t& sourceBox, aafBoundsBox_t& validBox);
 aafBoundsBox_t ToAAFBox(_aafRational_t positionX, _aafRational_t positionY, _aafRational_t width,
                         _aafRational_t height);
 

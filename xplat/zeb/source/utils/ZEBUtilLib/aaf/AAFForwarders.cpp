@@ -39,15 +39,14 @@ extern "C" {
 AAFRESULT AAFFileOpenExistingRead(const aafCharacter* a, aafUInt32 b, IAAFFile** c) {
     return Forward([&](AAFDLL& d) { return d.OpenExistingRead(a, b, c); });
 }
-AAFRESULT AAFFileOpenExistingModify(const aafCharacter* a, aafUInt32 b, aafProductIdentification_t* c,
-                                    IAAFFile** e) {
+AAFRESULT AAFFileOpenExistingModify(const aafCharacter* a, aafUInt32 b, aafProductIdentification_t* c, IAAFFile** e) {
     return Forward([&](AAFDLL& d) { return d.OpenExistingModify(a, b, c, e); });
 }
 AAFRESULT AAFFileOpenNewModify(const aafCharacter* a, aafUInt32 b, aafProductIdentification_t* c, IAAFFile** e) {
     return Forward([&](AAFDLL& d) { return d.OpenNewModify(a, b, c, e); });
 }
-AAFRESULT AAFFileOpenNewModifyEx(const aafCharacter* a, const aafUID_t* b, aafUInt32 c,
-                                 aafProductIdentification_t* e, IAAFFile** f) {
+AAFRESULT AAFFileOpenNewModifyEx(const aafCharacter* a, const aafUID_t* b, aafUInt32 c, aafProductIdentification_t* e,
+                                 IAAFFile** f) {
     return Forward([&](AAFDLL& d) { return d.OpenNewModifyEx(a, b, c, e, f); });
 }
 AAFRESULT AAFFileOpenTransient(aafProductIdentification_t* a, IAAFFile** b) {
@@ -71,8 +70,7 @@ AAFRESULT AAFGetPluginManager(IAAFPluginManager** a) {
 AAFRESULT AAFCreateRawStorageMemory(aafFileAccess_t a, IAAFRawStorage** b) {
     return Forward([&](AAFDLL& d) { return d.CreateRawStorageMemory(a, b); });
 }
-AAFRESULT AAFCreateRawStorageDisk(const aafCharacter* a, aafFileExistence_t b, aafFileAccess_t c,
-                                  IAAFRawStorage** e) {
+AAFRESULT AAFCreateRawStorageDisk(const aafCharacter* a, aafFileExistence_t b, aafFileAccess_t c, IAAFRawStorage** e) {
     return Forward([&](AAFDLL& d) { return d.CreateRawStorageDisk(a, b, c, e); });
 }
 AAFRESULT AAFCreateRawStorageCachedDisk(const aafCharacter* a, aafFileExistence_t b, aafFileAccess_t c, aafUInt32 e,

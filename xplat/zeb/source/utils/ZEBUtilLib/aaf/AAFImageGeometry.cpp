@@ -48,8 +48,7 @@ TOVRESULT GetWorldDimensions(_aafRational_t width, _aafRational_t height, _aafRa
 
 TOVRESULT CalculateDefaultOrrinBoxes(const Rectangle& essence, const Rectangle& source, const Rectangle& valid,
                                      _aafRational_t imageAspectRatio, _aafRational_t pixelAspectRatio,
-                                     aafBoundsBox_t& essenceBox, aafBoundsBox_t& sourceBox,
-                                     aafBoundsBox_t& validBox) {
+                                     aafBoundsBox_t& essenceBox, aafBoundsBox_t& sourceBox, aafBoundsBox_t& validBox) {
     if (!IsPositive(imageAspectRatio) && !IsPositive(pixelAspectRatio)) return TOV_E_NOTSUPPORTED;
     const Fraction imageAspect = From(imageAspectRatio), pixelAspect = From(pixelAspectRatio);
     try {

@@ -33,8 +33,7 @@ TOVRESULT GetWorldDimensions(_aafRational_t width, _aafRational_t height, _aafRa
 /// is positive or the arithmetic fails; the boxes change only on success.
 TOVRESULT CalculateDefaultOrrinBoxes(const Rectangle& essence, const Rectangle& source, const Rectangle& valid,
                                      _aafRational_t imageAspectRatio, _aafRational_t pixelAspectRatio,
-                                     aafBoundsBox_t& essenceBox, aafBoundsBox_t& sourceBox,
-                                     aafBoundsBox_t& validBox);
+                                     aafBoundsBox_t& essenceBox, aafBoundsBox_t& sourceBox, aafBoundsBox_t& validBox);
 
 }  // namespace AAFUtils
 }  // namespace ZEB

@@ -65,9 +65,7 @@ AAFRESULT AAFLoadLibrary(const char* name, void** pLibHandle) {
     return *pLibHandle ? AAFRESULT_SUCCESS : AAFRESULT_DLL_LOAD_FAILED;
 }
 
-AAFRESULT AAFUnloadLibrary(void* libHandle) {
-    return libHandle ? AAFRESULT_SUCCESS : AAFRESULT_NULL_PARAM;
-}
+AAFRESULT AAFUnloadLibrary(void* libHandle) { return libHandle ? AAFRESULT_SUCCESS : AAFRESULT_NULL_PARAM; }
 
 AAFRESULT AAFFindSymbol(void* libHandle, const char* symbolName, void** pSymbol) {
     if (!libHandle || !symbolName || !pSymbol) return AAFRESULT_NULL_PARAM;

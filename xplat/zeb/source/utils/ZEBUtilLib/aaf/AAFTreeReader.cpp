@@ -40,9 +40,9 @@ std::string Hex(const aafUInt8* bytes, size_t count) {
 /// The text form of the identifier sheet: {Data1-Data2-Data3-Data4[0..1]-Data4[2..7]}.
 std::string UIDText(const aafUID_t& id) {
     char text[64];
-    std::snprintf(text, sizeof text, "{%08X-%04X-%04X-%02X%02X-%02X%02X%02X%02X%02X%02X}", id.Data1, id.Data2,
-                  id.Data3, id.Data4[0], id.Data4[1], id.Data4[2], id.Data4[3], id.Data4[4], id.Data4[5],
-                  id.Data4[6], id.Data4[7]);
+    std::snprintf(text, sizeof text, "{%08X-%04X-%04X-%02X%02X-%02X%02X%02X%02X%02X%02X}", id.Data1, id.Data2, id.Data3,
+                  id.Data4[0], id.Data4[1], id.Data4[2], id.Data4[3], id.Data4[4], id.Data4[5], id.Data4[6],
+                  id.Data4[7]);
     return text;
 }
 
@@ -50,11 +50,12 @@ std::string UIDText(const aafUID_t& id) {
 std::string MobIDText(const aafMobID_t& id) {
     const aafUInt8* label = id.SMPTELabel;
     char text[128];
-    std::snprintf(text, sizeof text,
-                  "urn:smpte:umid:%02x%02x%02x%02x.%02x%02x%02x%02x.%02x%02x%02x%02x.%02x%02x%02x%02x.%08x.%04x.%04x.%s",
-                  label[0], label[1], label[2], label[3], label[4], label[5], label[6], label[7], label[8], label[9],
-                  label[10], label[11], id.length, id.instanceHigh, id.instanceMid, id.instanceLow, id.material.Data1,
-                  id.material.Data2, id.material.Data3, Hex(id.material.Data4, 8).c_str());
+    std::snprintf(
+        text, sizeof text,
+        "urn:smpte:umid:%02x%02x%02x%02x.%02x%02x%02x%02x.%02x%02x%02x%02x.%02x%02x%02x%02x.%08x.%04x.%04x.%s",
+        label[0], label[1], label[2], label[3], label[4], label[5], label[6], label[7], label[8], label[9], label[10],
+        label[11], id.length, id.instanceHigh, id.instanceMid, id.instanceLow, id.material.Data1, id.material.Data2,
+        id.material.Data3, Hex(id.material.Data4, 8).c_str());
     return text;
 }
 
@@ -140,8 +141,9 @@ AAFDumpNode AAFTreeReader::ReadValue(IAAFTypeDef* type, IAAFPropertyValue* value
             aafUInt32 count = 0;
             Check(text->GetCount(value, &count));
             std::vector<aafCharacter> chars(count + 1, 0);
-            if (count) Check(text->GetElements(value, reinterpret_cast<aafMemPtr_t>(chars.data()),
-                                               static_cast<aafUInt32>(count * sizeof(aafCharacter))));
+            if (count)
+                Check(text->GetElements(value, reinterpret_cast<aafMemPtr_t>(chars.data()),
+                                        static_cast<aafUInt32>(count * sizeof(aafCharacter))));
             return Leaf(AAFDumpNode::Kind::Text, wToUTF8(chars.data()));
         }
         case kAAFTypeCatStrongObjRef: {

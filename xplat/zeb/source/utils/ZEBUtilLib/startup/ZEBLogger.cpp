@@ -47,11 +47,11 @@ std::wstring ZEBLogger::BuildLine(std::wstring format) const {
 
 // The line is built before the argument list starts, so a throw while building
 // it never skips va_end.
-#define ZEB_LOGGER_WRITE(FORMAT_EXPR)                                \
-    const std::wstring line = BuildLine(FORMAT_EXPR);                \
-    va_list args;                                                    \
-    va_start(args, format);                                          \
-    ZEBUtilLib::gpConsole->PrintV(level, line.c_str(), args);        \
+#define ZEB_LOGGER_WRITE(FORMAT_EXPR)                         \
+    const std::wstring line = BuildLine(FORMAT_EXPR);         \
+    va_list args;                                             \
+    va_start(args, format);                                   \
+    ZEBUtilLib::gpConsole->PrintV(level, line.c_str(), args); \
     va_end(args)
 
 void ZEBLogger::Write(_tovDebugLevel level, const char* format, ...) {

@@ -49,8 +49,7 @@ TOVRESULT ZEBInitializeInternal(ITOVComponentFactory* factory, unsigned char*) {
         gpComponentFactory = factory;
 
         TOVPtr<ITOVComponentDefinition> definition;
-        TOVCheck(factory->GetComponentDefinition(TOVCompID_TOVString, IID_ITOVComponentDefinition,
-                                                 definition.Out()));
+        TOVCheck(factory->GetComponentDefinition(TOVCompID_TOVString, IID_ITOVComponentDefinition, definition.Out()));
         _tovUID clsid{};
         TOVCheck(definition->GetAttribute(TOVATTR_Component_CLSID, TOVTypeID_UID, &clsid, sizeof clsid));
         TOVCheck(factory->GetClassFactory(clsid, IID_ITOVClassFactory, reinterpret_cast<void**>(&gpClassFactory)));

@@ -41,8 +41,8 @@ TOVRESULT ZEBXmlDoc::Parse(Run&& run) {
     return TOVGuarded([&] {
         if (!m_pFactory) Throw(ZEB_E_NOTREADY);
         TOVPtr<UTIL::ITOVXmlParser> reader;
-        TOVCheck(m_pFactory->CreateComponent(UTIL::CompID_TOVXmlReader, nullptr, UTIL::IID_ITOVXmlParser,
-                                             reader.Out()));
+        TOVCheck(
+            m_pFactory->CreateComponent(UTIL::CompID_TOVXmlReader, nullptr, UTIL::IID_ITOVXmlParser, reader.Out()));
         TOVCheck(run(*reader));
         TOVPtr<ITOVUnknown> rootObject;
         TOVCheck(reader->GetRoot(rootObject.OutT()));

@@ -219,32 +219,32 @@ ZEBString ZEBXmlNode::GetValue() const {
 ZEBXmlNode* ZEBXmlNode::CreateNew(UTIL::ITOVXmlDomNode* dom) {
     if (!dom) Throw(TOV_E_INVALIDARG);
     switch (dom->GetNodeType()) {
-    case UTIL::kTOVXmlElement:
-        return new ZEBXmlElement();
-    case UTIL::kTOVXmlAttribute:
-        return new ZEBXmlAttribute();
-    case UTIL::kTOVXmlText:
-        return new ZEBXmlText();
-    case UTIL::kTOVXmlCDATA:
-        return new ZEBXmlCDATA();
-    default:
-        return nullptr;
+        case UTIL::kTOVXmlElement:
+            return new ZEBXmlElement();
+        case UTIL::kTOVXmlAttribute:
+            return new ZEBXmlAttribute();
+        case UTIL::kTOVXmlText:
+            return new ZEBXmlText();
+        case UTIL::kTOVXmlCDATA:
+            return new ZEBXmlCDATA();
+        default:
+            return nullptr;
     }
 }
 
 ZEBXmlNode* ZEBXmlNode::Bind(UTIL::ITOVXmlDomNode* dom) {
     if (!dom) Throw(TOV_E_INVALIDARG);
     switch (dom->GetNodeType()) {
-    case UTIL::kTOVXmlElement:
-        return new ZEBXmlElement(dom);
-    case UTIL::kTOVXmlAttribute:
-        return new ZEBXmlAttribute(dom);
-    case UTIL::kTOVXmlText:
-        return new ZEBXmlText(dom);
-    case UTIL::kTOVXmlCDATA:
-        return new ZEBXmlCDATA(dom);
-    default:
-        return nullptr;
+        case UTIL::kTOVXmlElement:
+            return new ZEBXmlElement(dom);
+        case UTIL::kTOVXmlAttribute:
+            return new ZEBXmlAttribute(dom);
+        case UTIL::kTOVXmlText:
+            return new ZEBXmlText(dom);
+        case UTIL::kTOVXmlCDATA:
+            return new ZEBXmlCDATA(dom);
+        default:
+            return nullptr;
     }
 }
 
