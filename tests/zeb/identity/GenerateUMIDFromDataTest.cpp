@@ -4,6 +4,7 @@
 
 #include <functional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "IdentityFixture.h"
@@ -18,44 +19,33 @@ unsigned char* Bytes(std::string& text) { return reinterpret_cast<unsigned char*
 
 class GenerateUMIDFromData : public IdentityFixture {};
 
-TEST_F(GenerateUMIDFromData, FeedsEveryPieceInOrderAndFreesTheHandle) {
+TEST_F(GenerateUMIDFromData, FeedsEveryPieceInOrderRefusesMissingArgumentsAndFreesTheHandle) {
     std::string first = "first piece", second = "; second";
     void* handle = nullptr;
     ASSERT_EQ(GenerateUMIDFromData_Begin(&handle), TOV_OK);
     ASSERT_NE(handle, nullptr);
-    EXPECT_EQ(GenerateUMIDFromData_AddData(&handle, 11, Bytes(first)), TOV_OK);
-    EXPECT_EQ(GenerateUMIDFromData_AddData(&handle, 8, Bytes(second)), TOV_OK);
-    _aafUID_t out{};
-    EXPECT_EQ(GenerateUMIDFromData_Finish(&handle, &out), TOV_OK);
-    EXPECT_EQ(handle, nullptr);
-    EXPECT_EQ(out, FakeUIDOf(first + second));
-}
-
-TEST_F(GenerateUMIDFromData, RefusesMissingArgumentsWithoutCallingTheGenerator) {
-    std::string data = "x";
-    void* handle = nullptr;
-    ASSERT_EQ(GenerateUMIDFromData_Begin(&handle), TOV_OK);
     void* noRecord = nullptr;
     _aafUID_t out{};
-    struct Case {
-        const char* name;
-        std::function<TOVRESULT()> call;
-    };
-    const std::vector<Case> cases = {
+    const std::vector<std::pair<const char*, std::function<TOVRESULT()>>> refused = {
         {"Begin without a handle", [] { return GenerateUMIDFromData_Begin(nullptr); }},
-        {"AddData without a handle", [&] { return GenerateUMIDFromData_AddData(nullptr, 1, Bytes(data)); }},
-        {"AddData of no bytes", [&] { return GenerateUMIDFromData_AddData(&handle, 0, Bytes(data)); }},
+        {"AddData without a handle", [&] { return GenerateUMIDFromData_AddData(nullptr, 1, Bytes(first)); }},
+        {"AddData of no bytes", [&] { return GenerateUMIDFromData_AddData(&handle, 0, Bytes(first)); }},
         {"AddData without data", [&] { return GenerateUMIDFromData_AddData(&handle, 1, nullptr); }},
-        {"AddData on a null record", [&] { return GenerateUMIDFromData_AddData(&noRecord, 1, Bytes(data)); }},
+        {"AddData on a null record", [&] { return GenerateUMIDFromData_AddData(&noRecord, 1, Bytes(first)); }},
         {"Finish without a handle", [&] { return GenerateUMIDFromData_Finish(nullptr, &out); }},
         {"Finish without out", [&] { return GenerateUMIDFromData_Finish(&handle, nullptr); }},
         {"Finish on a null record", [&] { return GenerateUMIDFromData_Finish(&noRecord, &out); }},
     };
-    for (const auto& c : cases) EXPECT_EQ(c.call(), TOV_E_INVALIDARG) << c.name;
+    for (const auto& [name, call] : refused) EXPECT_EQ(call(), TOV_E_INVALIDARG) << name;
     EXPECT_TRUE(log().added.empty());
     EXPECT_EQ(log().finishes, 0);
-    EXPECT_NE(handle, nullptr) << "a refused Finish keeps the digest";
+    ASSERT_NE(handle, nullptr) << "a refused Finish keeps the digest";
+
+    EXPECT_EQ(GenerateUMIDFromData_AddData(&handle, 11, Bytes(first)), TOV_OK);
+    EXPECT_EQ(GenerateUMIDFromData_AddData(&handle, 8, Bytes(second)), TOV_OK);
     EXPECT_EQ(GenerateUMIDFromData_Finish(&handle, &out), TOV_OK);
+    EXPECT_EQ(handle, nullptr);
+    EXPECT_EQ(out, FakeUIDOf(first + second));
 }
 
 TEST_F(GenerateUMIDFromData, WithoutAGeneratorTheRecordStaysAndEveryStepFails) {

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <string>
+#include <vector>
 
 #include "identity/GetProductID.h"
 
@@ -21,16 +22,14 @@ TEST(GetProductID, FillsTheRecordAndEveryCallRewritesTheOneVersionRecord) {
     const _aafUID_t expected = {0x3711D3CC, 0x62D0, 0x49D7, {0xB0, 0xAE, 0xC1, 0x18, 0x10, 0x1D, 0x1A, 0x16}};
     EXPECT_EQ(id.productID, expected);
     ASSERT_NE(id.productVersion, nullptr);
-    EXPECT_EQ(id.productVersion->major, 1);
-    EXPECT_EQ(id.productVersion->minor, 9);
-    EXPECT_EQ(id.productVersion->tertiary, 1);
-    EXPECT_EQ(id.productVersion->patchLevel, 10178);
-    EXPECT_EQ(id.productVersion->type, kAAFVersionUnknown);
+    const aafProductVersion_t& v = *id.productVersion;
+    EXPECT_EQ((std::vector<int>{v.major, v.minor, v.tertiary, v.patchLevel, v.type}),
+              (std::vector<int>{1, 9, 1, 10178, kAAFVersionUnknown}));
 
     ZEB::GetProductID(later, 5, 6, 7, 8, company, product, version, kProductID);
     EXPECT_EQ(id.productVersion, later.productVersion);
     EXPECT_EQ(id.platform, later.platform);
-    EXPECT_EQ(id.productVersion->major, 5) << "the earlier record sees the later numbers";
+    EXPECT_EQ(v.major, 5) << "the earlier record sees the later numbers";
 }
 
 }  // namespace

@@ -37,9 +37,7 @@ TEST_F(IDToString, WritesTheFieldsInTheirOrder) {
 
 TEST_F(IDToString, MobIDTextRoundTripsThroughItsDigits) {
     const std::vector<std::string> texts = {
-        std::string(64, '0'),
         std::string(64, 'F'),
-        "060A2B340101010101010F0013000000D5C7A4F2B1A611D8ABCD0030658A6504",
         // Every byte different, in either case: no digit pair lands in another's place.
         "000102030405060708090A0B0C0D0E0F101112131415161718191a1b1c1d1e1f",
     };

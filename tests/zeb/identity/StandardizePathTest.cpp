@@ -19,7 +19,6 @@ TEST_F(StandardizePathInPlace, RewritesBackslashesInTheStringItself) {
         std::wstring expected;
     };
     const std::vector<Case> cases = {
-        {"C:\\Media\\a.wav", L"C:/Media/a.wav"},
         {"\\\\server\\share\\", L"//server/share/"},
         {"caf\xC3\xA9\\\xE2\x82\xAC", L"caf\u00E9/\u20AC"},
         {"", L""},
