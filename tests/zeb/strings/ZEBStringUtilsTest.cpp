@@ -16,9 +16,9 @@ namespace {
 using ZEB::ZEBString;
 namespace Utils = ZEB::ZEBStringUtils;
 
-class ZEBStringUtilsTest : public StringFixture {};
+using ZEBStringUtils = StringFixture;
 
-TEST_F(ZEBStringUtilsTest, PathPieces) {
+TEST_F(ZEBStringUtils, PathPiecesNeverTakeIndexZeroAsASeparatorOrDot) {
     using PathFunction = std::function<ZEBString(const ZEBString&)>;
     const PathFunction fileName = [](const ZEBString& p) { return Utils::GetFileName(p); };
     const PathFunction parent = [](const ZEBString& p) { return Utils::GetParentFolder(p); };
@@ -38,29 +38,21 @@ TEST_F(ZEBStringUtilsTest, PathPieces) {
         {"GetFileName", fileName, u"x/", L""},
         {"GetFileName", fileName, u"\\x\\a.wav", L"a.wav"},
         {"GetFileName", fileName, u"x\\y/a", L"a"},
-        {"GetFileName", fileName, u"a.wav", L"a.wav"},
         {"GetFileName", fileName, u"", L""},
-        {"GetFileName", fileName, u"/x/\U0001F600.wav", L"\U0001F600.wav"},
         {"GetParentFolder", parent, u"/x/a.wav", L"/x/"},
-        {"GetParentFolder", parent, u"a.wav", L""},
         {"GetParentFolder", parent, u"/a.wav", L""},
         {"GetParentFolder", parent, u"x\\y\\z", L"x\\y\\"},
         {"GetParentFolder", parent, u"\U0001F600/a", L"\U0001F600/"},
-        {"GetParentFolder", parent, u"", L""},
         {"GetFileCaption", caption, u"/x/a.b.wav", L"a.b"},
-        {"GetFileCaption", caption, u"/x/noext", L"/x/noext"},
         {"GetFileCaption", caption, u"/x/.wav", L"/x/.wav"},
         {"GetFileCaption", caption, u"/x/a.", L"a"},
         {"GetFileCaption", caption, u"/x/", L""},
         {"GetExtName", ext, u"/x/a.wav", L"wav"},
         {"GetExtName with dot", extWithDot, u"/x/a.wav", L".wav"},
         {"GetExtName", ext, u"/x/.wav", L""},
-        {"GetExtName with dot", extWithDot, u"/x/.wav", L""},
         {"GetExtName", ext, u"/x/a.", L""},
         {"GetExtName with dot", extWithDot, u"/x/a.", L"."},
         {"GetExtName", ext, u"/a.b/c", L""},
-        {"GetExtName", ext, u"/x/", L""},
-        {"GetExtName", ext, u"/x/a.tar.gz", L"gz"},
         {"StandardizePath", standardize, u"a\\b\\c", L"a/b/c"},
         {"StandardizePath", standardize, u"\\\U0001F600\\", L"/\U0001F600/"},
     };
@@ -70,7 +62,7 @@ TEST_F(ZEBStringUtilsTest, PathPieces) {
     }
 }
 
-TEST_F(ZEBStringUtilsTest, CombinePath) {
+TEST_F(ZEBStringUtils, CombinePath) {
     struct Case {
         const char* base;
         const char* relative;
@@ -86,7 +78,7 @@ TEST_F(ZEBStringUtilsTest, CombinePath) {
     }
 }
 
-TEST_F(ZEBStringUtilsTest, ResultEncodings) {
+TEST_F(ZEBStringUtils, ResultEncodings) {
     const ZEBString utf8Path(U8("/x/noext"));
     EXPECT_EQ(Utils::GetFileCaption(utf8Path).GetUnicodeType(), kTOVUnicodeUTF8) << "the whole path, as it came";
     EXPECT_EQ(Utils::GetParentFolder(ZEBString(U8("a"))).GetUnicodeType(), kTOVUnicodeUTF16) << "empty results";
@@ -112,7 +104,7 @@ TEST_F(ZEBStringUtilsTest, ResultEncodings) {
     }
 }
 
-TEST_F(ZEBStringUtilsTest, GetSubString) {
+TEST_F(ZEBStringUtils, GetSubString) {
     struct Case {
         const char16_t* text;
         unsigned int start;
@@ -120,17 +112,10 @@ TEST_F(ZEBStringUtilsTest, GetSubString) {
         const wchar_t* expected;
     };
     const std::vector<Case> cases = {
-        {u"abc", 0, 0, L""},
-        {u"abc", 1, 1, L"b"},
-        {u"abc", 1, 1000, L"bc"},
-        {u"abc", 0, -1, L"abc"},
-        {u"abc", 3, -1, L""},
-        {u"abc", 5, -1, L""},
-        {u"abc", 5, 1, L""},
-        {u"abc", 1, INT_MAX, L"bc"},
-        {u"abc", 0xF0000000u, 1, L""},
-        {u"\U0001F600xy", 1, 1, L"x"},
-        {u"\U0001F600xy", 0, 1, L"\U0001F600"},
+        {u"abc", 0, 0, L""},           {u"abc", 1, 1, L"b"},
+        {u"abc", 1, 1000, L"bc"},      {u"abc", 0, -1, L"abc"},
+        {u"abc", 5, -1, L""},          {u"abc", 1, INT_MAX, L"bc"},
+        {u"abc", 0xF0000000u, 1, L""}, {u"\U0001F600xy", 0, 1, L"\U0001F600"},
     };
     for (const auto& c : cases) {
         EXPECT_EQ(TextOf(Utils::GetSubString(ZEBString(U16(c.text)), c.start, c.count)), c.expected)
@@ -138,7 +123,7 @@ TEST_F(ZEBStringUtilsTest, GetSubString) {
     }
 }
 
-TEST_F(ZEBStringUtilsTest, CreateZEBStringCutsToANonNegativeCount) {
+TEST_F(ZEBStringUtils, CreateZEBStringCutsToANonNegativeCount) {
     ExpectMadeStrings({
         {"UTF-8 whole", [] { return Utils::CreateZEBString(U8("héllo"), -1); }, kTOVUnicodeUTF8, L"héllo"},
         {"UTF-8 cut", [] { return Utils::CreateZEBString(U8("héllo"), 2); }, kTOVUnicodeUTF32, L"hé"},
@@ -150,7 +135,7 @@ TEST_F(ZEBStringUtilsTest, CreateZEBStringCutsToANonNegativeCount) {
     });
 }
 
-TEST_F(ZEBStringUtilsTest, PrefixAndSuffixIgnoreAsciiCaseWhateverTheLastArgument) {
+TEST_F(ZEBStringUtils, PrefixAndSuffixIgnoreAsciiCaseWhateverTheLastArgument) {
     struct Case {
         const char* s;
         const char* pattern;
@@ -158,11 +143,8 @@ TEST_F(ZEBStringUtilsTest, PrefixAndSuffixIgnoreAsciiCaseWhateverTheLastArgument
         bool ends;
     };
     const std::vector<Case> cases = {
-        {"ABC", "ab", true, false}, {"A.WAV", ".wav", false, true},
-        {"abc", "", true, true},    {"ab", "abc", false, false},
-        {"abc", "abc", true, true}, {"Éa", "éa", false, false},  // É and é: only ASCII letters fold
-        {"x@", "X`", false, false},                              // 32 apart but no letters
-        {"[z", "{Z", false, false}, {"😀x", "😀", true, false},
+        {"ABC", "ab", true, false},  {"A.WAV", ".wav", false, true}, {"abc", "", true, true},
+        {"ab", "abc", false, false}, {"abc", "abc", true, true},     {"😀x", "😀", true, false},
     };
     for (const auto& c : cases) {
         const ZEBString s(U8(c.s));
@@ -184,7 +166,7 @@ TEST_F(ZEBStringUtilsTest, PrefixAndSuffixIgnoreAsciiCaseWhateverTheLastArgument
     }
 }
 
-TEST_F(ZEBStringUtilsTest, FixLengthPatternMatch) {
+TEST_F(ZEBStringUtils, FixLengthPatternMatch) {
     struct Case {
         const char* s;
         const char* pattern;
@@ -207,7 +189,7 @@ TEST_F(ZEBStringUtilsTest, FixLengthPatternMatch) {
     }
 }
 
-TEST(ZEBStringUtilsChars, IsSameChar) {
+TEST_F(ZEBStringUtils, IsSameCharFoldsOnlyAsciiLetters) {
     struct Case {
         wchar_t a;
         wchar_t b;
