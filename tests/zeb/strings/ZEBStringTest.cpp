@@ -5,6 +5,7 @@
 
 #include <functional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "MockString.h"
@@ -20,11 +21,6 @@ using ::testing::DoAll;
 using ::testing::Return;
 using ::testing::SetArgPointee;
 using ZEB::ZEBString;
-
-struct NamedCall {
-    const char* name;
-    std::function<void()> call;
-};
 
 // Every way of making a string meets the one check in CreateString.
 TEST(ZEBStringBeforeStart, MakingAStringFailsWithNotReady) {
@@ -42,7 +38,7 @@ using ZEBStringSearch = StringFixture;
 TEST_F(ZEBStringUnset, ThrowsNotReadyUntilAStringIsMade) {
     ZEBString unset;
     ZEBString other(U8("x"));
-    const std::vector<NamedCall> calls = {
+    const std::vector<std::pair<const char*, std::function<void()>>> calls = {
         {"InArg", [&] { unset.InArg(); }},
         {"GetNumCharacters", [&] { unset.GetNumCharacters(); }},
         {"GetUnicodeType", [&] { unset.GetUnicodeType(); }},
@@ -58,7 +54,7 @@ TEST_F(ZEBStringUnset, ThrowsNotReadyUntilAStringIsMade) {
         {"share a null source", [] { ZEBString s(kTOVUnicodeUTF8, nullptr); }},
         {"assign a null source", [&] { other = static_cast<ITOVString*>(nullptr); }},
     };
-    for (const auto& c : calls) ExpectThrowsResult(c.call, ZEB_E_NOTREADY, c.name);
+    for (const auto& [name, call] : calls) ExpectThrowsResult(call, ZEB_E_NOTREADY, name);
 
     EXPECT_EQ(unset.IsEmpty(), 1);
     unset.Clear();
