@@ -70,12 +70,9 @@ TEST_F(AAFDescriptorExtensions, ContainerGUIDsAreSeparateAndTheLastValueStands) 
     aafUInt32 count = 0;
     Query<IAAFObject>(pcm.get())->CountProperties(&count);
     EXPECT_EQ(count, 2u);  // the two dynamic ones: the descriptor was never initialised
-}
-
-TEST_F(AAFDescriptorExtensions, MediaAccessKindOnAFileDescriptor) {
-    auto pcm = f.Create<IAAFFileDescriptor>(kAAFClassID_PCMDescriptor);
-    EXPECT_EQ(SetMediaAccessKind(f.dictionary.get(), pcm.get(), 3), TOV_OK);
-    EXPECT_EQ(SetMediaAccessKind(nullptr, pcm.get(), 3), TOV_E_POINTER);
+    // The access kind's value is pinned by the golden dumps; here its refusals.
+    auto file = Query<IAAFFileDescriptor>(pcm.get());
+    EXPECT_EQ(SetMediaAccessKind(nullptr, file.get(), 3), TOV_E_POINTER);
     EXPECT_EQ(SetMediaAccessKind(f.dictionary.get(), nullptr, 3), TOV_E_POINTER);
 }
 
@@ -111,12 +108,13 @@ TEST_F(AAFDescriptorExtensions, ClassIDOfObjectsButNotOfTheDictionary) {
     EXPECT_EQ(GetAAFClassID(mob.get()), kAAFClassID_MasterMob);
     auto dictionaryObject = Query<IAAFObject>(f.dictionary.get());
     ASSERT_TRUE(dictionaryObject);
+    int thrown = 0;
     try {
         GetAAFClassID(dictionaryObject.get());
-        FAIL() << "no exception";
     } catch (int result) {
-        EXPECT_EQ(result, static_cast<int>(TOV_E_UNEXPECTED));
+        thrown = result;
     }
+    EXPECT_EQ(thrown, static_cast<int>(TOV_E_UNEXPECTED));
 }
 
 bool SameRational(const _aafRational_t& a, const _aafRational_t& b) {

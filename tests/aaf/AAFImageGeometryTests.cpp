@@ -115,57 +115,31 @@ TEST_P(DefaultBoxes, AreCentredInTheWorldFrame) {
 const Rectangle kHD{{1920, 1}, {1080, 1}};
 const Rectangle kPAL{{720, 1}, {576, 1}};
 
+// A rectangle and a box of whole numbers.
+Rectangle Rect(int width, int height) { return {{width, 1}, {height, 1}}; }
+aafBoundsBox_t Box(int x, int y, int width, int height) { return ToAAFBox({x, 1}, {y, 1}, {width, 1}, {height, 1}); }
+
+BoxCase Case(const char* name, Rectangle essence, Rectangle source, Rectangle valid, _aafRational_t imageAspect,
+             _aafRational_t pixelAspect, aafBoundsBox_t essenceBox, aafBoundsBox_t sourceBox, aafBoundsBox_t validBox) {
+    return {name, essence, source, valid, imageAspect, pixelAspect, essenceBox, sourceBox, validBox};
+}
+
 INSTANTIATE_TEST_SUITE_P(
     Frames, DefaultBoxes,
-    ::testing::Values(BoxCase{"HDSquarePixels",
-                              kHD,
-                              kHD,
-                              {{1900, 1}, {1060, 1}},
-                              {0, 0},
-                              {1, 1},
-                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
-                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
-                              {{10, 1}, {10, 1}, {1900, 1}, {1060, 1}}},
+    ::testing::Values(Case("HDSquarePixels", kHD, kHD, Rect(1900, 1060), {0, 0}, {1, 1}, Box(0, 0, 1920, 1080),
+                           Box(0, 0, 1920, 1080), Box(10, 10, 1900, 1060)),
                       // Without a pixel aspect ratio, 16:9 over the HD frame gives square pixels again.
-                      BoxCase{"HDFromTheImageAspect",
-                              kHD,
-                              kHD,
-                              {{1901, 1}, {1080, 1}},
-                              {32, 18},
-                              {0, 1},
-                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
-                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
-                              {{19, 2}, {0, 1}, {1901, 1}, {1080, 1}}},
+                      Case("HDFromTheImageAspect", kHD, kHD, Rect(1901, 1080), {32, 18}, {0, 1}, Box(0, 0, 1920, 1080),
+                           Box(0, 0, 1920, 1080), ToAAFBox({19, 2}, {0, 1}, {1901, 1}, {1080, 1})),
                       // 720 x 576 is scaled to 600 x 480 and widened to 4:3 by the pixels' 16/15.
-                      BoxCase{"PALFromTheImageAspect",
-                              kPAL,
-                              {{1440, 2}, {576, 1}},
-                              {{702, 1}, {576, 1}},
-                              {4, 3},
-                              {0, 0},
-                              {{0, 1}, {0, 1}, {640, 1}, {480, 1}},
-                              {{0, 1}, {0, 1}, {640, 1}, {480, 1}},
-                              {{8, 1}, {0, 1}, {624, 1}, {480, 1}}},
+                      Case("PALFromTheImageAspect", kPAL, {{1440, 2}, {576, 1}}, Rect(702, 576), {4, 3}, {0, 0},
+                           Box(0, 0, 640, 480), Box(0, 0, 640, 480), Box(8, 0, 624, 480)),
                       // A positive pixel aspect ratio wins over the image aspect ratio.
-                      BoxCase{"PixelAspectWins",
-                              kPAL,
-                              kPAL,
-                              kPAL,
-                              {16, 9},
-                              {12, 10},
-                              {{0, 1}, {0, 1}, {720, 1}, {480, 1}},
-                              {{0, 1}, {0, 1}, {720, 1}, {480, 1}},
-                              {{0, 1}, {0, 1}, {720, 1}, {480, 1}}},
+                      Case("PixelAspectWins", kPAL, kPAL, kPAL, {16, 9}, {12, 10}, Box(0, 0, 720, 480),
+                           Box(0, 0, 720, 480), Box(0, 0, 720, 480)),
                       // A source larger than the essence lies at a negative position.
-                      BoxCase{"LargerSource",
-                              kHD,
-                              {{2000, 1}, {1100, 1}},
-                              kHD,
-                              {16, 9},
-                              {1, 1},
-                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}},
-                              {{-40, 1}, {-10, 1}, {2000, 1}, {1100, 1}},
-                              {{0, 1}, {0, 1}, {1920, 1}, {1080, 1}}}),
+                      Case("LargerSource", kHD, Rect(2000, 1100), kHD, {16, 9}, {1, 1}, Box(0, 0, 1920, 1080),
+                           Box(-40, -10, 2000, 1100), Box(0, 0, 1920, 1080))),
     [](const auto& info) { return std::string(info.param.name); });
 
 TEST(AAFImageGeometry, DefaultBoxesRefuseWhatCannotBeWorkedOut) {

@@ -38,6 +38,7 @@ TEST_F(AAFLoader, FirstForwarderCallLoadsTheDefaultLibraryBesideUs) {
     EXPECT_EQ(AAFLoad(nullptr), AAFRESULT_ALREADY_INITIALIZED);
     aafProductVersion_t version{};
     EXPECT_EQ(AAFGetLibraryVersion(&version), AAFRESULT_SUCCESS);
+    EXPECT_EQ(AAFGetStaticLibraryVersion(&version), AAFRESULT_SUCCESS);
     // Disk files answer not-implemented until the library has a file format.
     IAAFFile* file = nullptr;
     EXPECT_EQ(AAFFileOpenExistingRead(L"/nowhere.aaf", 0, &file), AAFRESULT_NOT_IMPLEMENTED);
@@ -52,34 +53,24 @@ TEST_F(AAFLoader, ObjectsOutliveAnUnload) {
     EXPECT_EQ(count, 1u);
 }
 
-TEST_F(AAFLoader, UnloadWithNothingLoadedAndStaticVersion) {
-    EXPECT_EQ(AAFUnload(), AAFRESULT_SUCCESS);
-    aafProductVersion_t version{};
-    EXPECT_EQ(AAFGetStaticLibraryVersion(&version), AAFRESULT_SUCCESS);
-    EXPECT_EQ(version.major, 2);
-    EXPECT_EQ(version.minor, 0);
-    EXPECT_EQ(version.tertiary, 8);
-    EXPECT_EQ(version.patchLevel, 10032);
-    EXPECT_EQ(version.type, kAAFVersionReleased);
-    EXPECT_EQ(AAFGetStaticLibraryVersion(nullptr), AAFRESULT_NULL_PARAM);
-    EXPECT_EQ(AAFDLL::GetAAFDLL(), nullptr);
-}
-
 struct LoadCase {
     const char* library;
     AAFRESULT loadResult;
 };
 
-class AAFLoaderLoad : public AAFLoader, public ::testing::WithParamInterface<LoadCase> {};
+// Names the case in test output instead of its bytes.
+void PrintTo(const LoadCase& c, std::ostream* out) { *out << c.library; }
 
-TEST_P(AAFLoaderLoad, RequiredSymbolsDecide) {
+class AAFLibraryLoad : public AAFLoader, public ::testing::WithParamInterface<LoadCase> {};
+
+TEST_P(AAFLibraryLoad, RequiredSymbolsDecide) {
     const LoadCase& c = GetParam();
     EXPECT_EQ(AAFLoad(Stub(c.library).c_str()), c.loadResult);
     // A failed load leaves no instance behind.
     EXPECT_EQ(AAFDLL::GetAAFDLL() != nullptr, c.loadResult == AAFRESULT_SUCCESS);
 }
 
-INSTANTIATE_TEST_SUITE_P(Libraries, AAFLoaderLoad,
+INSTANTIATE_TEST_SUITE_P(Libraries, AAFLibraryLoad,
                          ::testing::Values(LoadCase{"aaf_stub_complete", AAFRESULT_SUCCESS},
                                            LoadCase{"aaf_stub_no_transient", kSymbolMissing},
                                            LoadCase{"aaf_stub_no_read", kSymbolMissing},
@@ -125,6 +116,7 @@ TEST_F(AAFLoader, AnExceptionFromTheLibraryBecomesAResult) {
 }
 
 TEST(AAFLoaderPlatform, NullArguments) {
+    EXPECT_EQ(AAFGetStaticLibraryVersion(nullptr), AAFRESULT_NULL_PARAM);
     void* handle = nullptr;
     void* symbol = nullptr;
     EXPECT_EQ(AAFLoadLibrary(nullptr, &handle), AAFRESULT_NULL_PARAM);
@@ -136,21 +128,6 @@ TEST(AAFLoaderPlatform, NullArguments) {
               AAFRESULT_NULL_PARAM);
     EXPECT_EQ(AAFFindLibrary("/", nullptr, nullptr), AAFRESULT_NULL_PARAM);
 }
-
-class AAFFindLibraryTest : public ::testing::Test {
-protected:
-    void SetUp() override {
-        char pattern[] = "/tmp/aaf_find_XXXXXX";
-        ASSERT_NE(mkdtemp(pattern), nullptr);
-        m_dir = pattern;
-        for (const char* name : {"libgood.so", "lib.so.bak", "so", "notes.txt", "libother.so"})
-            std::ofstream(m_dir + "/" + name) << "x";
-        ASSERT_EQ(mkdir((m_dir + "/sub").c_str(), 0700), 0);
-    }
-    void TearDown() override { std::system(("rm -rf '" + m_dir + "'").c_str()); }
-
-    std::string m_dir;
-};
 
 struct Seen {
     std::vector<std::pair<std::string, char>> entries;
@@ -164,26 +141,25 @@ AAFRESULT Record(const char* path, const char* name, char isDirectory, void* use
     return seen->stopAfter && seen->entries.size() == seen->stopAfter ? 42 : 0;
 }
 
-TEST_F(AAFFindLibraryTest, ReportsLibrariesAndFoldersOnly) {
-    Seen seen;
-    ASSERT_EQ(AAFFindLibrary(m_dir.c_str(), &Record, &seen), AAFRESULT_SUCCESS);
+TEST(AAFFindLibrary, ReportsLibrariesAndFoldersUntilTheCallbackStopsIt) {
+    char pattern[] = "/tmp/aaf_find_XXXXXX";
+    ASSERT_NE(mkdtemp(pattern), nullptr);
+    const std::string dir = pattern;
+    for (const char* name : {"libgood.so", "lib.so.bak", "so", "notes.txt", "libother.so"})
+        std::ofstream(dir + "/" + name) << "x";
+    ASSERT_EQ(mkdir((dir + "/sub").c_str(), 0700), 0);
+
+    Seen seen, stopped;
+    ASSERT_EQ(AAFFindLibrary(dir.c_str(), &Record, &seen), AAFRESULT_SUCCESS);
     std::sort(seen.entries.begin(), seen.entries.end());
     const std::vector<std::pair<std::string, char>> expected = {{"libgood.so", 0}, {"libother.so", 0}, {"sub", 1}};
     EXPECT_EQ(seen.entries, expected);
-}
-
-TEST_F(AAFFindLibraryTest, CallbackStopsTheWalkWithItsResult) {
-    Seen seen;
-    seen.stopAfter = 1;
-    EXPECT_EQ(AAFFindLibrary(m_dir.c_str(), &Record, &seen), 42);
-    EXPECT_EQ(seen.entries.size(), 1u);
-}
-
-TEST_F(AAFFindLibraryTest, MissingFolderAndOverlongPath) {
-    Seen seen;
-    EXPECT_EQ(AAFFindLibrary((m_dir + "/absent").c_str(), &Record, &seen), static_cast<AAFRESULT>(0x80120021u));
-    const std::string longPath = m_dir + std::string(1100, '/');
-    EXPECT_EQ(AAFFindLibrary(longPath.c_str(), &Record, &seen), AAFRESULT_INVALID_PARAM);
+    stopped.stopAfter = 1;
+    EXPECT_EQ(AAFFindLibrary(dir.c_str(), &Record, &stopped), 42);
+    EXPECT_EQ(stopped.entries.size(), 1u);
+    EXPECT_EQ(AAFFindLibrary((dir + "/absent").c_str(), &Record, &seen), static_cast<AAFRESULT>(0x80120021u));
+    EXPECT_EQ(AAFFindLibrary((dir + std::string(1100, '/')).c_str(), &Record, &seen), AAFRESULT_INVALID_PARAM);
+    std::system(("rm -rf '" + dir + "'").c_str());
 }
 
 }  // namespace

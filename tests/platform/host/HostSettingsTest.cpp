@@ -16,39 +16,37 @@ TOVPtr<IHostSettings> NewSettings(TOVHost* host) {
     return settings;
 }
 
-class HostSettingsTest : public ::testing::Test {
+// Named after its subject; the component itself is ::HostSettings.
+class HostSettings : public ::testing::Test {
 protected:
+    uint32_t ValueOf(const _tovUID& setting) {
+        uint32_t value = 0xDEAD;
+        EXPECT_EQ(settings->GetSetting(setting, 16, &value), TOV_OK);
+        return value;
+    }
+
     TestHost host;
     TOVPtr<IHostSettings> settings = NewSettings(host.Get());
 };
 
-TEST_F(HostSettingsTest, AreSharedByTheSettingsObjectsOfOneHostOnly) {
-    ASSERT_EQ(settings->SetSetting(kGrouping, 32, 0), TOV_OK);
+TEST_F(HostSettings, AreSharedByTheSettingsObjectsOfOneHostOnly) {
     ASSERT_EQ(settings->SetSetting(kOtherSetting, 32, 5), TOV_OK);
-    TOVPtr<IHostSettings> second = NewSettings(host.Get());
-    uint32_t value = 0xDEAD;
-    ASSERT_EQ(second->GetSetting(kGrouping, 16, &value), TOV_OK);
-    EXPECT_EQ(value, 0u);
-    ASSERT_EQ(second->SetSetting(kGrouping, 32, 1), TOV_OK);
-    ASSERT_EQ(settings->GetSetting(kGrouping, 16, &value), TOV_OK);
-    EXPECT_EQ(value, 1u);
-    ASSERT_EQ(settings->GetSetting(kOtherSetting, 16, &value), TOV_OK);
-    EXPECT_EQ(value, 5u);
+    ASSERT_EQ(NewSettings(host.Get())->SetSetting(kGrouping, 32, 1), TOV_OK);
+    EXPECT_EQ(ValueOf(kGrouping), 1u);
+    EXPECT_EQ(ValueOf(kOtherSetting), 5u);
 
     TestHost otherHost;
-    value = 0xDEAD;
+    uint32_t value = 0xDEAD;
     EXPECT_EQ(NewSettings(otherHost.Get())->GetSetting(kGrouping, 16, &value), ZEB_E_NOTFOUND);
     EXPECT_EQ(value, 0xDEADu) << "an unset setting leaves the value";
 }
 
-struct SizeCase {
-    uint32_t size;
-    TOVRESULT expected;
-};
-
-TEST_F(HostSettingsTest, AnySizeUpTo32BitsReadsAndWritesTheWholeValue) {
-    const SizeCase cases[] = {{0, TOV_E_INVALIDARG}, {1, TOV_OK}, {32, TOV_OK}, {33, TOV_E_INVALIDARG}};
-    for (const SizeCase& c : cases) {
+TEST_F(HostSettings, AnySizeUpTo32BitsReadsAndWritesTheWholeValue) {
+    const struct {
+        uint32_t size;
+        TOVRESULT expected;
+    } cases[] = {{0, TOV_E_INVALIDARG}, {1, TOV_OK}, {32, TOV_OK}, {33, TOV_E_INVALIDARG}};
+    for (const auto& c : cases) {
         SCOPED_TRACE(c.size);
         EXPECT_EQ(settings->SetSetting(kGrouping, c.size, 0x12345678u + c.size), c.expected);
         uint32_t value = 0;
@@ -60,10 +58,10 @@ TEST_F(HostSettingsTest, AnySizeUpTo32BitsReadsAndWritesTheWholeValue) {
     EXPECT_EQ(settings->GetSetting(kGrouping, 16, nullptr), TOV_E_INVALIDARG);
 }
 
-TEST(HostSettingsCreation, NeedsAHostWithAStore) {
-    TOVPtr<IHostSettings> settings;
-    EXPECT_EQ(HostSettings::TOVCreate(nullptr, nullptr, IID_IHostSettings, settings.Out()), ZEB_E_NOTREADY);
-    EXPECT_FALSE(settings);
+TEST_F(HostSettings, NeedAHostWithAStore) {
+    TOVPtr<IHostSettings> made;
+    EXPECT_EQ(::HostSettings::TOVCreate(nullptr, nullptr, IID_IHostSettings, made.Out()), ZEB_E_NOTREADY);
+    EXPECT_FALSE(made);
 }
 
 }  // namespace

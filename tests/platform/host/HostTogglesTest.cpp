@@ -39,41 +39,50 @@ protected:
     TOVPtr<IFTFManager> manager = NewManager(host.Get());
 };
 
-TEST_F(HostToggles, AreSharedByTheManagersOfOneHostOnly) {
+TEST_F(HostToggles, AreSharedByTheManagersOfOneHostOnlyAndOutliveIt) {
     ASSERT_EQ(manager->RegisterToggle(kPath, 0, "group"), TOV_OK);
     TOVPtr<IFTFManager> second = NewManager(host.Get());
     EXPECT_EQ(second->IsToggleRegistered(kPath), 1);
     ASSERT_EQ(second->SetToggleValue(kPath, 7), TOV_OK);
     EXPECT_EQ(ValueOf(*manager, kPath), 7u);
 
-    TestHost otherHost;
-    TOVPtr<IFTFManager> elsewhere = NewManager(otherHost.Get());
-    EXPECT_EQ(elsewhere->IsToggleRegistered(kPath), 0);
-    ASSERT_EQ(elsewhere->RegisterToggle(kPath, 3, "group"), TOV_OK);
-    EXPECT_EQ(ValueOf(*elsewhere, kPath), 3u);
+    TOVPtr<IFTFManager> elsewhere;
+    {
+        TestHost otherHost;
+        elsewhere = NewManager(otherHost.Get());
+        EXPECT_EQ(elsewhere->IsToggleRegistered(kPath), 0);
+        ASSERT_EQ(elsewhere->RegisterToggle(kPath, 3, "group"), TOV_OK);
+    }
+    EXPECT_EQ(ValueOf(*elsewhere, kPath), 3u) << "a manager keeps the toggles of a host gone";
     EXPECT_EQ(ValueOf(*manager, kPath), 7u);
 }
 
-TEST_F(HostToggles, ASecondRegistrationIsRefusedAndKeepsValueDefaultAndGroup) {
-    ASSERT_EQ(manager->RegisterToggle(kPath, 1, "first"), TOV_OK);
+TEST_F(HostToggles, KeepTheFirstRegistrationUntilUnregistered) {
+    ASSERT_EQ(manager->RegisterToggle(kPath, 4, "first"), TOV_OK);
     ASSERT_EQ(manager->SetToggleValue(kPath, 5), TOV_OK);
     EXPECT_EQ(manager->RegisterToggle(kPath, 9, "second"), ZEB_E_ALREADYSET);
     EXPECT_EQ(ValueOf(*manager, kPath), 5u);
     uint32_t defaultValue = 0;
     EXPECT_EQ(manager->GetToggleDefault(kPath, &defaultValue), TOV_OK);
-    EXPECT_EQ(defaultValue, 1u);
+    EXPECT_EQ(defaultValue, 4u);
     ITOVString* group = nullptr;
     ASSERT_EQ(manager->GetToggleGroup(kPath, &group), TOV_OK);
     EXPECT_EQ(TextOf(group), "first");
-    uint32_t count = 0;
-    EXPECT_EQ(manager->GetToggleCount(&count), TOV_OK);
-    EXPECT_EQ(count, 1u);
+
+    ASSERT_EQ(manager->ResetToggle(kPath), TOV_OK);
+    EXPECT_EQ(ValueOf(*manager, kPath), 4u);
+    ASSERT_EQ(manager->SetToggleValue(kPath, 8), TOV_OK);
+    ASSERT_EQ(manager->UnregisterToggle(kPath), TOV_OK);
+    EXPECT_EQ(manager->IsToggleRegistered(kPath), 0);
+    ASSERT_EQ(manager->RegisterToggle(kPath, 2, "g"), TOV_OK);
+    EXPECT_EQ(ValueOf(*manager, kPath), 2u) << "unregistering forgets the value";
 }
 
-TEST_F(HostToggles, ListsPathsInOrderOfRegistration) {
+TEST_F(HostToggles, ListPathsInOrderOfRegistration) {
     for (const char* path : {kOther, kPath, ""}) ASSERT_EQ(manager->RegisterToggle(path, 0, "g"), TOV_OK);
     ASSERT_EQ(manager->UnregisterToggle(kOther), TOV_OK);
-    ASSERT_EQ(manager->RegisterToggle(kOther, 0, "g"), TOV_OK);  // goes to the end
+    ASSERT_EQ(manager->RegisterToggle(kOther, 0, "g"), TOV_OK);           // goes to the end
+    EXPECT_EQ(manager->RegisterToggle(kPath, 0, "g"), ZEB_E_ALREADYSET);  // and a refused one nowhere
 
     uint32_t count = 0;
     ASSERT_EQ(manager->GetToggleCount(&count), TOV_OK);
@@ -88,19 +97,6 @@ TEST_F(HostToggles, ListsPathsInOrderOfRegistration) {
     ITOVString* past = reinterpret_cast<ITOVString*>(0x1);
     EXPECT_EQ(manager->GetTogglePath(count, &past), TOV_E_OUTOFRANGE);
     EXPECT_EQ(past, nullptr);
-}
-
-TEST_F(HostToggles, ResetGoesBackToTheDefaultAndUnregisterForgetsTheValue) {
-    ASSERT_EQ(manager->RegisterToggle(kPath, 4, "g"), TOV_OK);
-    ASSERT_EQ(manager->SetToggleValue(kPath, 0), TOV_OK);
-    ASSERT_EQ(manager->ResetToggle(kPath), TOV_OK);
-    EXPECT_EQ(ValueOf(*manager, kPath), 4u);
-
-    ASSERT_EQ(manager->SetToggleValue(kPath, 8), TOV_OK);
-    ASSERT_EQ(manager->UnregisterToggle(kPath), TOV_OK);
-    EXPECT_EQ(manager->IsToggleRegistered(kPath), 0);
-    ASSERT_EQ(manager->RegisterToggle(kPath, 2, "g"), TOV_OK);
-    EXPECT_EQ(ValueOf(*manager, kPath), 2u);
 }
 
 TEST_F(HostToggles, UnknownPathsAreNotFoundAndNullPathsOrPlacesInvalid) {
@@ -124,7 +120,6 @@ TEST_F(HostToggles, UnknownPathsAreNotFoundAndNullPathsOrPlacesInvalid) {
     }
     EXPECT_EQ(group, nullptr);
     EXPECT_EQ(value, 0xDEADu);
-    EXPECT_EQ(manager->IsToggleRegistered(kPath), 0);
     EXPECT_EQ(manager->IsToggleRegistered(nullptr), 0);
     EXPECT_EQ(ValueOf(*manager, kOther), 0u);  // nothing above touched the registered one
 
@@ -138,26 +133,15 @@ TEST_F(HostToggles, UnknownPathsAreNotFoundAndNullPathsOrPlacesInvalid) {
     EXPECT_EQ(manager->GetToggleValue(kOther, nullptr), TOV_E_INVALIDARG);
 }
 
-TEST_F(HostToggles, AManagerOutlivingItsHostKeepsTheToggles) {
-    TOVPtr<IFTFManager> survivor;
-    {
-        TestHost shortLived;
-        survivor = NewManager(shortLived.Get());
-        ASSERT_EQ(survivor->RegisterToggle(kPath, 6, "g"), TOV_OK);
-    }
-    EXPECT_EQ(ValueOf(*survivor, kPath), 6u);
-}
-
-TEST(HostTogglesCreation, NeedsAHostWithAStore) {
-    TOVPtr<IFTFManager> manager;
-    EXPECT_EQ(HostFTFManager::TOVCreate(nullptr, nullptr, IID_IFTFManager, manager.Out()), ZEB_E_NOTREADY);
-    EXPECT_FALSE(manager);
+TEST_F(HostToggles, NeedAHostWithAStore) {
+    TOVPtr<IFTFManager> made;
+    EXPECT_EQ(HostFTFManager::TOVCreate(nullptr, nullptr, IID_IFTFManager, made.Out()), ZEB_E_NOTREADY);
+    EXPECT_FALSE(made);
     // Any component other than the host: it has no stores to give.
-    TestHost host;
     TOVPtr<ITOVUnknown> notAHost;
     ASSERT_EQ(host->CreateComponent(TOVCompID_TOVString, nullptr, IID_ITOVUnknown, notAHost.Out()), TOV_OK);
-    EXPECT_EQ(HostFTFManager::TOVCreate(notAHost.Get(), nullptr, IID_IFTFManager, manager.Out()), TOV_E_NOINTERFACE);
-    EXPECT_FALSE(manager);
+    EXPECT_EQ(HostFTFManager::TOVCreate(notAHost.Get(), nullptr, IID_IFTFManager, made.Out()), TOV_E_NOINTERFACE);
+    EXPECT_FALSE(made);
 }
 
 }  // namespace

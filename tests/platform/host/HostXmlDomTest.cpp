@@ -8,8 +8,6 @@
 
 #include "TestHost.h"
 #include "XmlTestSupport.h"
-#include "tov/ITOVXmlDom.h"
-#include "tov/ITOVXmlParser.h"
 #include "tov/ITOVXmlWriter.h"
 
 namespace {
@@ -18,34 +16,10 @@ using namespace UTIL;
 
 class HostXmlDom : public ::testing::Test {
 protected:
-    TOVPtr<ITOVXmlParser> Parser() {
-        TOVPtr<ITOVXmlParser> parser;
-        EXPECT_EQ(host->CreateComponent(CompID_TOVXmlReader, nullptr, IID_ITOVXmlParser, parser.Out()), TOV_OK);
-        return parser;
-    }
     TOVPtr<ITOVXmlDomNode> Root(const std::string& text) {
-        TOVPtr<ITOVXmlParser> parser = Parser();
+        TOVPtr<ITOVXmlParser> parser = NewDomReader(host.Get());
         EXPECT_EQ(parser->ParseText(Str(text).Get()), TOV_OK);
-        TOVPtr<ITOVUnknown> root;
-        EXPECT_EQ(parser->GetRoot(root.OutT()), TOV_OK);
-        TOVPtr<ITOVXmlDomNode> node;
-        EXPECT_EQ(root->QueryInterface(IID_ITOVXmlDomNode, node.Out()), TOV_OK);
-        return node;
-    }
-    static std::string Name(ITOVXmlDomNode* node) {
-        TOVPtr<ITOVString> s;
-        EXPECT_EQ(node->GetName(s.OutT()), TOV_OK);
-        return Utf8(s.Get());
-    }
-    static std::string Value(ITOVXmlDomNode* node) {
-        TOVPtr<ITOVString> s;
-        EXPECT_EQ(node->GetValue(s.OutT()), TOV_OK);
-        return Utf8(s.Get());
-    }
-    static TOVPtr<ITOVXmlDomNode> Child(ITOVXmlDomNode* node, uint32_t index) {
-        TOVPtr<ITOVXmlDomNode> child;
-        EXPECT_EQ(node->GetChild(index, child.OutT()), TOV_OK);
-        return child;
+        return RootOf(parser.Get());
     }
 
     TestHost host;
@@ -54,7 +28,7 @@ protected:
 TEST_F(HostXmlDom, ChildrenKeepDocumentOrderAndTheirTypes) {
     TOVPtr<ITOVXmlDomNode> root =
         Root("<BWFXML><!-- made by hand --><SCENE>12A</SCENE>text<![CDATA[<raw>]]><?pi data?></BWFXML>");
-    EXPECT_EQ(Name(root.Get()), "BWFXML");
+    EXPECT_EQ(NameOf(root), "BWFXML");
     ASSERT_EQ(root->GetChildCount(), 5u);
     const struct {
         int32_t type;
@@ -68,34 +42,35 @@ TEST_F(HostXmlDom, ChildrenKeepDocumentOrderAndTheirTypes) {
         {kTOVXmlProcessingInstruction, "pi", "data"},
     };
     for (uint32_t i = 0; i < 5; ++i) {
-        TOVPtr<ITOVXmlDomNode> child = Child(root.Get(), i);
-        EXPECT_EQ(child->GetNodeType(), expected[i].type) << i;
-        EXPECT_EQ(Name(child.Get()), expected[i].name) << i;
-        EXPECT_EQ(Value(child.Get()), expected[i].value) << i;
+        SCOPED_TRACE(i);
+        TOVPtr<ITOVXmlDomNode> child = ChildOf(root, i);
+        EXPECT_EQ(child->GetNodeType(), expected[i].type);
+        EXPECT_EQ(NameOf(child), expected[i].name);
+        EXPECT_EQ(ValueOf(child), expected[i].value);
     }
-    TOVPtr<ITOVXmlDomNode> scene = Child(root.Get(), 1);
-    EXPECT_EQ(Value(Child(scene.Get(), 0).Get()), "12A");
+    EXPECT_EQ(ValueOf(ChildOf(ChildOf(root, 1), 0)), "12A");
     void* out = reinterpret_cast<void*>(1);
     EXPECT_EQ(root->GetChild(5, reinterpret_cast<ITOVXmlDomNode**>(&out)), TOV_E_OUTOFRANGE);
     EXPECT_EQ(out, nullptr);
-    EXPECT_EQ(Name(Child(root.Get(), 4).Get()), "pi") << "children are still found after one past the end";
-    EXPECT_EQ(Name(Child(root.Get(), 0).Get()), "#comment");
+    EXPECT_EQ(NameOf(ChildOf(root, 4)), "pi") << "children are still found after one past the end";
+    EXPECT_EQ(NameOf(ChildOf(root, 0)), "#comment");
 }
 
 TEST_F(HostXmlDom, IndentationIsNotContent) {
     TOVPtr<ITOVXmlDomNode> root = Root("<BWFXML>\n  <SCENE>  </SCENE>\n  <NOTE>a <B>b</B> c</NOTE>\n</BWFXML>\n");
     ASSERT_EQ(root->GetChildCount(), 2u) << "the line breaks and indents between elements are gone";
-    TOVPtr<ITOVXmlDomNode> scene = Child(root.Get(), 0);
+    TOVPtr<ITOVXmlDomNode> scene = ChildOf(root, 0);
     ASSERT_EQ(scene->GetChildCount(), 1u);
-    EXPECT_EQ(Value(Child(scene.Get(), 0).Get()), "  ") << "a leaf element keeps its text as written";
-    TOVPtr<ITOVXmlDomNode> note = Child(root.Get(), 1);
+    EXPECT_EQ(ValueOf(ChildOf(scene, 0)), "  ") << "a leaf element keeps its text as written";
+    TOVPtr<ITOVXmlDomNode> note = ChildOf(root, 1);
     ASSERT_EQ(note->GetChildCount(), 3u);
-    EXPECT_EQ(Value(Child(note.Get(), 2).Get()), " c") << "mixed content keeps its spaces";
+    EXPECT_EQ(ValueOf(ChildOf(note, 2)), " c") << "mixed content keeps its spaces";
 }
 
 TEST_F(HostXmlDom, AttributesComeAsAListOfAttributeViews) {
     TOVPtr<ITOVXmlDomNode> root = Root(R"(<TRACK index="2" name="Boom &amp; mix"/>)");
     EXPECT_EQ(root->HasAttributes(), 1);
+    EXPECT_EQ(root->GetChildCount(), 0u) << "attributes are not children";
     TOVPtr<ITOVXmlDomNodeList> list;
     ASSERT_EQ(root->GetAttributes(list.OutT()), TOV_OK);
     ASSERT_EQ(list->GetCount(), 2u);
@@ -104,97 +79,65 @@ TEST_F(HostXmlDom, AttributesComeAsAListOfAttributeViews) {
     EXPECT_EQ(item->GetNodeType(), kTOVXmlAttribute);
     TOVPtr<ITOVXmlDomAttribute> attribute;
     ASSERT_EQ(item->QueryInterface(IID_ITOVXmlDomAttribute, attribute.Out()), TOV_OK);
-    TOVPtr<ITOVString> name, value;
+    TOVPtr<ITOVString> name, value, tag;
     ASSERT_EQ(attribute->GetAttributeName(name.OutT()), TOV_OK);
     ASSERT_EQ(attribute->GetAttributeValue(value.OutT()), TOV_OK);
     EXPECT_EQ(Utf8(name.Get()), "name");
     EXPECT_EQ(Utf8(value.Get()), "Boom & mix");
-    EXPECT_EQ(root->GetChildCount(), 0u) << "attributes are not children";
 
     TOVPtr<ITOVXmlDomElement> element;
     ASSERT_EQ(root->QueryInterface(IID_ITOVXmlDomElement, element.Out()), TOV_OK);
-    TOVPtr<ITOVString> tag;
     ASSERT_EQ(element->GetTagName(tag.OutT()), TOV_OK);
     EXPECT_EQ(Utf8(tag.Get()), "TRACK");
-    TOVPtr<ITOVXmlDomAttribute> notAnAttribute;
-    EXPECT_EQ(root->QueryInterface(IID_ITOVXmlDomAttribute, notAnAttribute.Out()), TOV_E_NOINTERFACE);
+    EXPECT_EQ(root->QueryInterface(IID_ITOVXmlDomAttribute, attribute.Out()), TOV_E_NOINTERFACE);
 }
 
-TEST_F(HostXmlDom, TextIsUnicodeWhateverTheDeclarationSays) {
-    TOVPtr<ITOVXmlDomNode> root = Root("<?xml version=\"1.0\" encoding=\"ISO-8859-1\"?><NOTE>Grüße 😀</NOTE>");
-    EXPECT_EQ(Value(Child(root.Get(), 0).Get()), "Grüße 😀");
-}
+TEST_F(HostXmlDom, TextIsUnicodeAndAFileIsReadInItsDeclaredEncoding) {
+    const std::string declaration = "<?xml version=\"1.0\" encoding=\"ISO-8859-1\"?>";
+    EXPECT_EQ(ValueOf(ChildOf(Root(declaration + "<NOTE>Grüße 😀</NOTE>"), 0)), "Grüße 😀");
 
-TEST_F(HostXmlDom, AFileIsReadInItsDeclaredEncoding) {
     const std::string path = ::testing::TempDir() + "latin1.xml";
-    {
-        std::ofstream file(path, std::ios::binary);
-        file << "<?xml version=\"1.0\" encoding=\"ISO-8859-1\"?><NOTE>Gr\xFC\xDF"
-                "e</NOTE>";
-    }
-    TOVPtr<ITOVXmlParser> parser = Parser();
+    std::ofstream(path, std::ios::binary) << declaration << "<NOTE>Gr\xFC\xDF"
+                                          << "e</NOTE>";
+    TOVPtr<ITOVXmlParser> parser = NewDomReader(host.Get());
     ASSERT_EQ(parser->ParseFile(Str(path).Get()), TOV_OK);
-    TOVPtr<ITOVUnknown> root;
-    ASSERT_EQ(parser->GetRoot(root.OutT()), TOV_OK);
-    TOVPtr<ITOVXmlDomNode> node;
-    ASSERT_EQ(root->QueryInterface(IID_ITOVXmlDomNode, node.Out()), TOV_OK);
-    EXPECT_EQ(Value(Child(node.Get(), 0).Get()), "Grüße");
+    EXPECT_EQ(ValueOf(ChildOf(RootOf(parser.Get()), 0)), "Grüße");
     std::remove(path.c_str());
+    EXPECT_EQ(parser->ParseFile(Str(path).Get()), TOV_E_FILEOPEN);
+    EXPECT_NE(LastError(parser.Get()).find(path), std::string::npos);
 }
 
 TEST_F(HostXmlDom, NodesOutliveTheirParser) {
     TOVPtr<ITOVXmlDomNode> scene;
     {
         TOVPtr<ITOVXmlDomNode> root = Root("<BWFXML><SCENE>7</SCENE></BWFXML>");
-        scene = Child(root.Get(), 0);
+        scene = ChildOf(root, 0);
     }
-    EXPECT_EQ(Value(Child(scene.Get(), 0).Get()), "7");
+    EXPECT_EQ(ValueOf(ChildOf(scene, 0)), "7");
 }
-
-struct BadDocument {
-    const char* name;
-    const char* text;
-};
 
 TEST_F(HostXmlDom, MalformedTextFailsWithAReason) {
-    const BadDocument cases[] = {
-        {"empty", ""},
-        {"unclosed", "<BWFXML><SCENE>1</BWFXML>"},
-        {"two roots", "<A/><B/>"},
-        {"undeclared entity", "<A>&nope;</A>"},
-        {"text only", "just words"},
-    };
-    for (const BadDocument& c : cases) {
-        TOVPtr<ITOVXmlParser> parser = Parser();
-        EXPECT_EQ(parser->ParseText(Str(c.text).Get()), TOV_E_FAIL) << c.name;
-        TOVPtr<ITOVString> error;
-        ASSERT_EQ(parser->GetLastError(error.OutT()), TOV_OK);
-        EXPECT_FALSE(Utf8(error.Get()).empty()) << c.name;
-        TOVPtr<ITOVUnknown> root;
-        EXPECT_EQ(parser->GetRoot(root.OutT()), ZEB_E_NOTREADY) << c.name;
-    }
-}
-
-TEST_F(HostXmlDom, MissingFileAndMissingTextAreRefused) {
-    TOVPtr<ITOVXmlParser> parser = Parser();
-    EXPECT_EQ(parser->ParseFile(Str("/nonexistent/take1.xml").Get()), TOV_E_FILEOPEN);
-    TOVPtr<ITOVString> error;
-    ASSERT_EQ(parser->GetLastError(error.OutT()), TOV_OK);
-    EXPECT_NE(Utf8(error.Get()).find("/nonexistent/take1.xml"), std::string::npos);
+    TOVPtr<ITOVXmlParser> parser = NewDomReader(host.Get());
     EXPECT_EQ(parser->ParseText(nullptr), TOV_E_POINTER);
+    for (const char* text : {"", "<BWFXML><SCENE>1</BWFXML>", "<A/><B/>", "<A>&nope;</A>", "just words"}) {
+        SCOPED_TRACE(text);
+        EXPECT_EQ(parser->ParseText(Str(text).Get()), TOV_E_FAIL);
+        EXPECT_FALSE(LastError(parser.Get()).empty());
+        TOVPtr<ITOVUnknown> root;
+        EXPECT_EQ(parser->GetRoot(root.OutT()), ZEB_E_NOTREADY);
+    }
 }
 
-class HostXmlWriterTest : public HostXmlDom {
+class HostXmlWriter : public HostXmlDom {
 protected:
-    TOVPtr<ITOVXmlWriter> Writer() {
-        TOVPtr<ITOVXmlWriter> writer;
-        EXPECT_EQ(host->CreateComponent(CompID_TOVXmlWriter, nullptr, IID_ITOVXmlWriter, writer.Out()), TOV_OK);
-        return writer;
-    }
+    TOVPtr<ITOVXmlWriter> writer = [this] {
+        TOVPtr<ITOVXmlWriter> made;
+        EXPECT_EQ(host->CreateComponent(CompID_TOVXmlWriter, nullptr, IID_ITOVXmlWriter, made.Out()), TOV_OK);
+        return made;
+    }();
 };
 
-TEST_F(HostXmlWriterTest, ElementsNestByTheTagOfTheirParent) {
-    TOVPtr<ITOVXmlWriter> writer = Writer();
+TEST_F(HostXmlWriter, ElementsNestByTheTagOfTheirParent) {
     ASSERT_EQ(writer->Open(nullptr), TOV_OK);
     ASSERT_EQ(writer->WriteElement(Str("BWFXML").Get(), nullptr), TOV_OK);
     ASSERT_EQ(writer->WriteElement(Str("TRACK_LIST").Get(), Str("BWFXML").Get()), TOV_OK);
@@ -214,13 +157,10 @@ TEST_F(HostXmlWriterTest, ElementsNestByTheTagOfTheirParent) {
               "    <TRACK name=\"Lav &lt;1&gt; &amp; &quot;2&quot;\">Lav &lt;1&gt; &amp; \"2\"</TRACK>\n"
               "  </TRACK_LIST>\n"
               "</BWFXML>\n");
-    // What the writer writes, the reader reads back.
-    TOVPtr<ITOVXmlDomNode> root = Root(xml);
-    EXPECT_EQ(Name(root.Get()), "BWFXML");
+    EXPECT_EQ(NameOf(Root(xml)), "BWFXML") << "what the writer writes, the reader reads back";
 }
 
-TEST_F(HostXmlWriterTest, MisuseIsRefused) {
-    TOVPtr<ITOVXmlWriter> writer = Writer();
+TEST_F(HostXmlWriter, MisuseIsRefused) {
     EXPECT_EQ(writer->WriteElement(Str("A").Get(), nullptr), ZEB_E_NOTREADY);
     TOVPtr<ITOVString> text;
     EXPECT_EQ(writer->GetText(text.OutT()), ZEB_E_NOTREADY);
@@ -233,19 +173,15 @@ TEST_F(HostXmlWriterTest, MisuseIsRefused) {
     EXPECT_EQ(writer->WriteAttribute(Str("a").Get(), Str("1").Get(), nullptr), TOV_E_POINTER);
 }
 
-TEST_F(HostXmlWriterTest, CloseWritesTheFile) {
+TEST_F(HostXmlWriter, CloseWritesTheFile) {
     const std::string path = ::testing::TempDir() + "written.xml";
-    TOVPtr<ITOVXmlWriter> writer = Writer();
-    ASSERT_EQ(writer->Open(Str(path).Get()), TOV_OK);
-    ASSERT_EQ(writer->WriteElement(Str("SCMain").Get(), nullptr), TOV_OK);
-    ASSERT_EQ(writer->Close(), TOV_OK);
-    TOVPtr<ITOVXmlParser> parser = Parser();
-    EXPECT_EQ(parser->ParseFile(Str(path).Get()), TOV_OK);
+    for (const std::string& target : {path, std::string("/nonexistent/dir/out.xml")}) {
+        ASSERT_EQ(writer->Open(Str(target).Get()), TOV_OK);
+        ASSERT_EQ(writer->WriteElement(Str("SCMain").Get(), nullptr), TOV_OK);
+        EXPECT_EQ(writer->Close(), target == path ? TOV_OK : TOV_E_FILEIO);
+    }
+    EXPECT_EQ(NewDomReader(host.Get())->ParseFile(Str(path).Get()), TOV_OK);
     std::remove(path.c_str());
-
-    ASSERT_EQ(writer->Open(Str("/nonexistent/dir/out.xml").Get()), TOV_OK);
-    ASSERT_EQ(writer->WriteElement(Str("SCMain").Get(), nullptr), TOV_OK);
-    EXPECT_EQ(writer->Close(), TOV_E_FILEIO);
 }
 
 }  // namespace

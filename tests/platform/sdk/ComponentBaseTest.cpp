@@ -25,6 +25,7 @@ protected:
 std::vector<std::string> g_events;
 TOVRESULT g_initResult = TOV_OK;
 ITOVUnknown* g_lastHost = nullptr;
+const std::vector<std::string> kReleased = {"FinalRelease", "destructor"};
 
 class TestWidget : public ITestWidget, public CTOVUnknown {
 public:
@@ -44,7 +45,6 @@ public:
     void FinalRelease() override { g_events.push_back("FinalRelease"); }
     TOVRESULT InternalQueryInterface(const _tovUID& iid, void** out) override {
         return TOVGuarded([&] {
-            if (!out) return TOV_E_INVALIDARG;
             if (iid == IID_ITestWidget) return TOVExpose<ITestWidget>(this, out);
             return CTOVUnknown::InternalQueryInterface(iid, out);
         });
@@ -63,7 +63,8 @@ public:
     uint32_t count = 1;
 };
 
-class ComponentBase : public ::testing::Test {
+// Every case must leave as many live objects as it found.
+class ComponentFixture : public ::testing::Test {
 protected:
     void SetUp() override {
         g_events.clear();
@@ -73,62 +74,49 @@ protected:
     }
     void TearDown() override { EXPECT_EQ(CTOVUnknown::GetActiveObjectCount(), m_StartObjects); }
 
-    TOVPtr<ITOVClassFactory> Factory() {
-        TOVPtr<ITOVClassFactory> factory;
-        EXPECT_EQ(CTOVClassFactory::Create(TestWidget::TOVCreate, IID_ITOVClassFactory, factory.Out()), TOV_OK);
-        return factory;
-    }
-
     int32_t m_StartObjects = 0;
     CountingOuter m_Host;
 };
 
-TEST_F(ComponentBase, FactoryCreateWithUnknownInterfaceLeavesNothingBehind) {
+using ClassFactory = ComponentFixture;
+using ComponentCreation = ComponentFixture;
+
+TEST_F(ClassFactory, CreateHandsOutTheOnlyReferenceOrNothing) {
     void* out = reinterpret_cast<void*>(0x1);
     EXPECT_EQ(CTOVClassFactory::Create(TestWidget::TOVCreate, IID_IUnrelated, &out), TOV_E_NOINTERFACE);
     EXPECT_EQ(out, nullptr);
-}
-
-TEST_F(ComponentBase, FactoryCreateRefusesNullArguments) {
-    void* out = nullptr;
     EXPECT_EQ(CTOVClassFactory::Create(nullptr, IID_ITOVClassFactory, &out), TOV_E_INVALIDARG);
     EXPECT_EQ(CTOVClassFactory::Create(TestWidget::TOVCreate, IID_ITOVClassFactory, nullptr), TOV_E_INVALIDARG);
-}
 
-TEST_F(ComponentBase, FactoryHoldsTheCallersOnlyReference) {
-    TOVPtr<ITOVClassFactory> factory = Factory();
+    TOVPtr<ITOVClassFactory> factory;
+    ASSERT_EQ(CTOVClassFactory::Create(TestWidget::TOVCreate, IID_ITOVClassFactory, factory.Out()), TOV_OK);
     EXPECT_EQ(factory->AddRef(), 2u);
     EXPECT_EQ(factory->Release(), 1u);
 }
 
-TEST_F(ComponentBase, AggregationIsRefusedForAnyInterfaceButUnknown) {
-    TOVPtr<ITOVClassFactory> factory = Factory();
-    CountingOuter outer;
+TEST_F(ClassFactory, CreateInstanceChecksArgumentsAndRefusesAggregationButForUnknown) {
+    TOVPtr<ITOVClassFactory> factory;
+    ASSERT_EQ(CTOVClassFactory::Create(TestWidget::TOVCreate, IID_ITOVClassFactory, factory.Out()), TOV_OK);
     void* out = reinterpret_cast<void*>(0x1);
+    EXPECT_EQ(factory->CreateInstance(nullptr, nullptr, IID_ITestWidget, &out), TOV_E_INVALIDARG);
+    EXPECT_EQ(factory->CreateInstance(&m_Host, nullptr, IID_ITestWidget, nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(CTOVClassFactory(nullptr, nullptr).CreateInstance(&m_Host, nullptr, IID_ITestWidget, &out),
+              TOV_E_UNEXPECTED);
+
+    CountingOuter outer;
     EXPECT_EQ(factory->CreateInstance(&m_Host, &outer, IID_ITOVClassFactory, &out), CLASS_E_NOAGGREGATION);
     EXPECT_EQ(out, nullptr);
     EXPECT_EQ(g_lastHost, nullptr) << "the creator must not run";
-
     EXPECT_EQ(factory->CreateInstance(&m_Host, &outer, IID_ITOVUnknown, &out), TOV_OK);
     EXPECT_EQ(g_lastHost, &m_Host);
     static_cast<ITOVUnknown*>(out)->Release();
 }
 
-TEST_F(ComponentBase, CreateInstanceChecksItsArguments) {
-    TOVPtr<ITOVClassFactory> factory = Factory();
-    void* out = nullptr;
-    EXPECT_EQ(factory->CreateInstance(nullptr, nullptr, IID_ITestWidget, &out), TOV_E_INVALIDARG);
-    EXPECT_EQ(factory->CreateInstance(&m_Host, nullptr, IID_ITestWidget, nullptr), TOV_E_INVALIDARG);
-
-    CTOVClassFactory empty(nullptr, nullptr);
-    EXPECT_EQ(empty.CreateInstance(&m_Host, nullptr, IID_ITestWidget, &out), TOV_E_UNEXPECTED);
-}
-
-TEST_F(ComponentBase, FreeStandingIdentityIsThePrivateUnknown) {
+TEST_F(ComponentCreation, FreeStandingIdentityIsThePrivateUnknown) {
     TOVPtr<ITestWidget> widget;
     ASSERT_EQ(TestWidget::TOVCreate(&m_Host, nullptr, IID_ITestWidget, widget.Out()), TOV_OK);
+    EXPECT_EQ(CTOVUnknown::GetActiveObjectCount(), m_StartObjects + 1);
     EXPECT_EQ(widget->Value(), 42);
-
     ITOVUnknown* identity = nullptr;
     ASSERT_EQ(widget->QueryInterface(IID_ITOVUnknown, reinterpret_cast<void**>(&identity)), TOV_OK);
     EXPECT_NE(static_cast<void*>(identity), static_cast<void*>(widget.Get()));
@@ -136,9 +124,12 @@ TEST_F(ComponentBase, FreeStandingIdentityIsThePrivateUnknown) {
     EXPECT_EQ(widget->AddRef(), 3u);
     EXPECT_EQ(identity->Release(), 2u);
     EXPECT_EQ(widget->Release(), 1u);
+    // A pointer used as an out parameter releases what it held: the last reference here.
+    ASSERT_EQ(TestWidget::TOVCreate(&m_Host, nullptr, IID_ITestWidget, widget.Out()), TOV_OK);
+    EXPECT_EQ(g_events, kReleased);
 }
 
-TEST_F(ComponentBase, AggregatedPublicPartCountsOnTheOuter) {
+TEST_F(ComponentCreation, AggregatedPublicPartCountsOnTheOuter) {
     CountingOuter outer;
     ITOVUnknown* inner = nullptr;
     ASSERT_EQ(TestWidget::TOVCreate(&m_Host, &outer, IID_ITOVUnknown, reinterpret_cast<void**>(&inner)), TOV_OK);
@@ -152,58 +143,29 @@ TEST_F(ComponentBase, AggregatedPublicPartCountsOnTheOuter) {
     EXPECT_EQ(outer.count, 1u);
     EXPECT_TRUE(g_events.empty());
     inner->Release();  // the inner's own count reaches zero
-    EXPECT_EQ(g_events, (std::vector<std::string>{"FinalRelease", "destructor"}));
+    EXPECT_EQ(g_events, kReleased);
 }
 
-TEST_F(ComponentBase, LastReleaseRunsFinalReleaseBeforeTheDestructor) {
-    const int32_t before = CTOVUnknown::GetActiveObjectCount();
-    TOVPtr<ITestWidget> widget;
-    ASSERT_EQ(TestWidget::TOVCreate(&m_Host, nullptr, IID_ITestWidget, widget.Out()), TOV_OK);
-    EXPECT_EQ(CTOVUnknown::GetActiveObjectCount(), before + 1);
-    widget.Reset();
-    EXPECT_EQ(g_events, (std::vector<std::string>{"FinalRelease", "destructor"}));
-    EXPECT_EQ(CTOVUnknown::GetActiveObjectCount(), before);
-}
-
-TEST_F(ComponentBase, FailedInitializationLeavesNothingBehind) {
-    g_initResult = TOV_E_POINTER;
+TEST_F(ComponentCreation, FailuresLeaveNothingBehind) {
     void* out = reinterpret_cast<void*>(0x1);
+    EXPECT_EQ(TestWidget::TOVCreate(&m_Host, nullptr, IID_IUnrelated, &out), TOV_E_NOINTERFACE);
+    EXPECT_EQ(out, nullptr);
+    EXPECT_EQ(g_events, kReleased);
+
+    g_events.clear();
+    g_initResult = TOV_E_POINTER;
+    out = reinterpret_cast<void*>(0x1);
     EXPECT_EQ(TestWidget::TOVCreate(&m_Host, nullptr, IID_ITestWidget, &out), TOV_E_POINTER);
     EXPECT_EQ(out, nullptr);
     // Destroyed directly, not through the release path.
     EXPECT_EQ(g_events, std::vector<std::string>{"destructor"});
 }
 
-TEST_F(ComponentBase, CreateWithUnknownInterfaceDestroysTheObject) {
-    void* out = reinterpret_cast<void*>(0x1);
-    EXPECT_EQ(TestWidget::TOVCreate(&m_Host, nullptr, IID_IUnrelated, &out), TOV_E_NOINTERFACE);
-    EXPECT_EQ(out, nullptr);
-    EXPECT_EQ(g_events, (std::vector<std::string>{"FinalRelease", "destructor"}));
-}
-
-TEST_F(ComponentBase, InternalQueryInterfaceRefusesNullOut) {
-    TOVPtr<ITestWidget> widget;
-    ASSERT_EQ(TestWidget::TOVCreate(&m_Host, nullptr, IID_ITestWidget, widget.Out()), TOV_OK);
-    EXPECT_EQ(widget->QueryInterface(IID_ITestWidget, nullptr), TOV_E_INVALIDARG);
-}
-
-TEST_F(ComponentBase, EmptyPointerReadThrowsPointerCode) {
+TEST(TOVPtr, ReadingAnEmptyPointerThrowsThePointerCode) {
     TOVPtr<ITestWidget> empty;
     EXPECT_FALSE(empty);
-    try {
-        empty->Value();
-        FAIL() << "no throw";
-    } catch (int code) {
-        EXPECT_EQ(code, TOV_E_POINTER);
-    }
-    EXPECT_THROW(*empty, int);
-}
-
-TEST_F(ComponentBase, PointerOutParameterReleasesWhatItHeld) {
-    TOVPtr<ITestWidget> widget;
-    ASSERT_EQ(TestWidget::TOVCreate(&m_Host, nullptr, IID_ITestWidget, widget.Out()), TOV_OK);
-    ASSERT_EQ(TestWidget::TOVCreate(&m_Host, nullptr, IID_ITestWidget, widget.Out()), TOV_OK);
-    EXPECT_EQ(g_events, (std::vector<std::string>{"FinalRelease", "destructor"}));
+    EXPECT_EQ(TOVGuarded([&] { return static_cast<TOVRESULT>(empty->Value()); }), TOV_E_POINTER);
+    EXPECT_EQ(TOVGuarded([&] { return static_cast<TOVRESULT>((*empty).Value()); }), TOV_E_POINTER);
 }
 
 }  // namespace
