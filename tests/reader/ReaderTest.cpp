@@ -5,14 +5,14 @@
 #include "TempFile.h"
 #include "startup/ZEBUtilLib.h"
 
-void ReaderTest::SetUp() {
+void ReaderFixture::SetUp() {
     ASSERT_EQ(ZEB::ZEBInitialize(host.Get()), TOV_OK);
     host.ClearLines();
 }
 
-void ReaderTest::TearDown() { ZEB::ZEBTerminate(); }
+void ReaderFixture::TearDown() { ZEB::ZEBTerminate(); }
 
-std::unique_ptr<Orlo::OrloStream> ReaderTest::Open(const std::string& bytes) {
+std::unique_ptr<Orlo::OrloStream> ReaderFixture::Open(const std::string& bytes) {
     TempFile file(bytes);
     const int before = OpenDescriptorCount();
     auto stream = std::make_unique<Orlo::OrloStream>(file.Path().c_str(), 255);
@@ -20,7 +20,7 @@ std::unique_ptr<Orlo::OrloStream> ReaderTest::Open(const std::string& bytes) {
     return stream;
 }
 
-std::string ReaderTest::ErrorOf(const std::string& bytes) {
+std::string ReaderFixture::ErrorOf(const std::string& bytes) {
     const char* error = Open(bytes)->GetError();
     return error ? error : "";
 }

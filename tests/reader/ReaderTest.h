@@ -9,7 +9,7 @@
 #include "TestHost.h"
 #include "reader/OrloStream.h"
 
-class ReaderTest : public ::testing::Test {
+class ReaderFixture : public ::testing::Test {
 protected:
     void SetUp() override;
     void TearDown() override;
