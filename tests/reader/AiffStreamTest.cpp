@@ -37,6 +37,7 @@ struct AiffRow {
     bool floating;
     bool dataWrongEndian;
 };
+void PrintTo(const AiffRow& row, std::ostream* os) { *os << row.name; }
 
 class AiffStream : public ReaderFixture, public ::testing::WithParamInterface<AiffRow> {};
 

@@ -52,6 +52,7 @@ struct FailureRow {
     std::string bytes;
     const char* error;
 };
+void PrintTo(const FailureRow& row, std::ostream* os) { *os << row.name; }
 
 class WaveFailure : public ReaderFixture, public ::testing::WithParamInterface<FailureRow> {};
 
@@ -117,6 +118,7 @@ struct WalkRow {
     int64_t samples;
     unsigned found;
 };
+void PrintTo(const WalkRow& row, std::ostream* os) { *os << row.name; }
 
 class ChunkWalk : public ReaderFixture, public ::testing::WithParamInterface<WalkRow> {};
 
@@ -245,6 +247,7 @@ struct FmtRow {
     bool pcm;
     bool floating;
 };
+void PrintTo(const FmtRow& row, std::ostream* os) { *os << row.name; }
 
 class FmtCode : public ReaderFixture, public ::testing::WithParamInterface<FmtRow> {};
 
