@@ -47,7 +47,7 @@ std::string Hex(const std::string& bytes) {
     return out;
 }
 
-TEST(ProbeCommandTest, ExampleTakeMatchesGolden) {
+TEST(ProbeCommand, ExampleTakeMatchesGolden) {
     Json report = ProbeJson(kExample);
     // The path as given is the only thing that depends on the machine.
     ASSERT_EQ(report["file"], kExample);
@@ -63,7 +63,7 @@ TEST(ProbeCommandTest, ExampleTakeMatchesGolden) {
     EXPECT_EQ(dump, golden.str()) << "output differs from " << path;
 }
 
-TEST(ProbeCommandTest, TogglesChooseWhereTheMobIDComesFrom) {
+TEST(ProbeCommand, TogglesChooseWhereTheMobIDComesFrom) {
     const std::string umid = ExampleTake::BextPayload().substr(348, 32);
     const struct {
         std::string arguments;
@@ -82,7 +82,7 @@ TEST(ProbeCommandTest, TogglesChooseWhereTheMobIDComesFrom) {
     for (const auto& c : cases) EXPECT_EQ(ProbeJson(c.arguments + " " + kExample)["mobID"], c.mobID) << c.arguments;
 }
 
-TEST(ProbeCommandTest, GroupingSettingReachesThePlugin) {
+TEST(ProbeCommand, GroupingSettingReachesThePlugin) {
     const std::string ignore = Toggle(toggle_IgnoreHostSettingsForUnitTest, 1);
     const struct {
         std::string arguments;
@@ -97,7 +97,7 @@ TEST(ProbeCommandTest, GroupingSettingReachesThePlugin) {
         EXPECT_EQ(ProbeJson(c.arguments + " " + kExample)["groupingAllowed"], c.allowed) << c.arguments;
 }
 
-TEST(ProbeCommandTest, UsageErrorsExit2AndSayWhy) {
+TEST(ProbeCommand, UsageErrorsExit2AndSayWhy) {
     const struct {
         std::string arguments;
         const char* message;
@@ -114,7 +114,7 @@ TEST(ProbeCommandTest, UsageErrorsExit2AndSayWhy) {
     }
 }
 
-TEST(ProbeCommandTest, FileThePluginCannotReadFailsWithItsCodeAndReason) {
+TEST(ProbeCommand, FileThePluginCannotReadFailsWithItsCodeAndReason) {
     TempFile text("This is a shot list, not a recording.\n");
     const Json report = ProbeJson(text.Path(), 1);
     EXPECT_EQ(report["result"], "0x8000FFFF");
@@ -131,7 +131,7 @@ TEST(ProbeCommandTest, FileThePluginCannotReadFailsWithItsCodeAndReason) {
     EXPECT_EQ(Probe("/nonexistent/take.wav").status, 1);
 }
 
-TEST(ProbeCommandTest, TextShowsAlignedClipLinesAndATrackTable) {
+TEST(ProbeCommand, TextShowsAlignedClipLinesAndATrackTable) {
     const ToolOutcome outcome = Probe(kExample);
     ASSERT_EQ(outcome.status, 0);
     std::istringstream lines(outcome.out);
