@@ -63,38 +63,25 @@ TEST(ProbeCommand, ExampleTakeMatchesGolden) {
     EXPECT_EQ(dump, golden.str()) << "output differs from " << path;
 }
 
-TEST(ProbeCommand, TogglesChooseWhereTheMobIDComesFrom) {
+// Toggles choose where the Mob ID comes from, and the grouping setting reaches
+// the plug-in unless a toggle has it make no settings object.
+TEST(ProbeCommand, TogglesAndTheGroupingSettingReachThePlugin) {
     const std::string umid = ExampleTake::BextPayload().substr(348, 32);
     const struct {
         std::string arguments;
-        std::string mobID;
+        const char* key;
+        Json value;
     } cases[] = {
-        // The bext UMID with its material fields turned into the machine's order.
-        {"", Hex(umid.substr(0, 16)) +
-                 "117C2B5E"
-                 "034A"
-                 "EF11" +
-                 Hex(umid.substr(24, 8))},
-        {Toggle(toggle_BigEndianSmpteIdInBEXTData, 1), Hex(umid)},
+        // The bext UMID with its material fields (Data1, Data2, Data3) turned into the machine's order.
+        {"", "mobID", Hex(umid.substr(0, 16)) + "117C2B5E034AEF11" + Hex(umid.substr(24, 8))},
+        {Toggle(toggle_BigEndianSmpteIdInBEXTData, 1), "mobID", Hex(umid)},
         // The iXML FILE_UID's first 32 characters taken as bytes.
-        {Toggle(toggle_MobIDFromiXML, 7), Hex("ORL12A0003D20240517T134510A1B2C3")},
+        {Toggle(toggle_MobIDFromiXML, 7), "mobID", Hex("ORL12A0003D20240517T134510A1B2C3")},
+        {"", "groupingAllowed", true},
+        {"--no-autodetect-groups", "groupingAllowed", false},
+        {"--no-autodetect-groups " + Toggle(toggle_IgnoreHostSettingsForUnitTest, 1), "groupingAllowed", true},
     };
-    for (const auto& c : cases) EXPECT_EQ(ProbeJson(c.arguments + " " + kExample)["mobID"], c.mobID) << c.arguments;
-}
-
-TEST(ProbeCommand, GroupingSettingReachesThePlugin) {
-    const std::string ignore = Toggle(toggle_IgnoreHostSettingsForUnitTest, 1);
-    const struct {
-        std::string arguments;
-        bool allowed;
-    } cases[] = {
-        {"", true},
-        {"--no-autodetect-groups", false},
-        // With the toggle the plug-in makes no settings object and keeps its default.
-        {"--no-autodetect-groups " + ignore, true},
-    };
-    for (const auto& c : cases)
-        EXPECT_EQ(ProbeJson(c.arguments + " " + kExample)["groupingAllowed"], c.allowed) << c.arguments;
+    for (const auto& c : cases) EXPECT_EQ(ProbeJson(c.arguments + " " + kExample)[c.key], c.value) << c.arguments;
 }
 
 TEST(ProbeCommand, UsageErrorsExit2AndSayWhy) {

@@ -98,13 +98,7 @@ TEST_F(IXMLTextParsers, NumbersOfEachKind) {
     EXPECT_DOUBLE_EQ(version, 2.1);
 }
 
-TEST(IXMLTextHelpers, TruncateAndSplit) {
-    std::string text = std::string("<A>b</A>\0\0pad", 13);
-    TruncateIXMLString(text);
-    EXPECT_EQ(text, "<A>b</A>");
-    std::string none = "no markup";
-    TruncateIXMLString(none);
-    EXPECT_EQ(none, "no markup");
+TEST(SplitString, KeepsEmptyPieces) {
     EXPECT_EQ(HelperFunctions::SplitString("25/", '/'), (std::vector<std::string>{"25", ""}));
     EXPECT_EQ(HelperFunctions::SplitString("a", '/'), (std::vector<std::string>{"a"}));
     EXPECT_EQ(HelperFunctions::SplitString("/a//", '/'), (std::vector<std::string>{"", "a", "", ""}));
