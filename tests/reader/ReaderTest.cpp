@@ -5,6 +5,18 @@
 #include "TempFile.h"
 #include "startup/ZEBUtilLib.h"
 
+namespace {
+// How many descriptors the process holds open.
+int OpenDescriptorCount() {
+    DIR* folder = opendir("/proc/self/fd");
+    if (!folder) return -1;
+    int count = 0;
+    while (readdir(folder)) ++count;
+    closedir(folder);
+    return count;
+}
+}  // namespace
+
 void ReaderFixture::SetUp() {
     ASSERT_EQ(ZEB::ZEBInitialize(host.Get()), TOV_OK);
     host.ClearLines();
@@ -23,13 +35,4 @@ std::unique_ptr<Orlo::OrloStream> ReaderFixture::Open(const std::string& bytes) 
 std::string ReaderFixture::ErrorOf(const std::string& bytes) {
     const char* error = Open(bytes)->GetError();
     return error ? error : "";
-}
-
-int OpenDescriptorCount() {
-    DIR* folder = opendir("/proc/self/fd");
-    if (!folder) return -1;
-    int count = 0;
-    while (readdir(folder)) ++count;
-    closedir(folder);
-    return count;
 }

@@ -22,6 +22,3 @@ protected:
 
     TestHost host;
 };
-
-/// How many descriptors the process holds open.
-int OpenDescriptorCount();
