@@ -38,7 +38,7 @@ TEST_F(IxmlChunk, TextIsMendedBeforeAnyoneParsesIt) {
         {"only the first misspelling", "<?xml encording=\"UTF-8\"?><BWFXML><NOTE>encording</NOTE></BWFXML>",
          "<?xml encoding=\"UTF-8\"?><BWFXML><NOTE>encording</NOTE></BWFXML>"},
         {"odd size gains its pad byte, then loses it", "<BWFXML/>", "<BWFXML/>"},
-        {"text without markup kept whole", "no markup", "no markup"},
+        {"even text without markup kept whole", "no markup.", "no markup."},
     };
     for (const Repair& c : cases) {
         auto stream = Open(Wave(c.written));
