@@ -44,9 +44,9 @@ struct HostValueCase {
     bool after;
 };
 
-TEST(HostsSettings, DecideWhenTheyHaveAValue) {
+TEST(AudioImportSettings, HostsDecideWhenTheyHaveAValue) {
     const HostValueCase cases[] = {
-        {"unset keeps true", false, 0, true, true},
+        // Unset keeps the caller's value; the stand-ins below show it kept true.
         {"unset keeps false", false, 0, false, false},
         {"zero turns grouping off", true, 0, true, false},
         {"any other value turns it on", true, 2, false, true},
@@ -77,7 +77,7 @@ struct CallerSettingsCase {
     Kept kept;
 };
 
-TEST(CallersSettings, AreAskedOnlyWhileTheHostIsIgnored) {
+TEST(AudioImportSettings, CallersAreAskedOnlyWhileTheHostIsIgnored) {
     const CallerSettingsCase cases[] = {
         {"ignoring the host makes none", true, true, false, false, true, Kept::Nothing},
         {"ignoring the host asks the caller's", true, true, true, true, false, Kept::CallersOwn},
@@ -102,7 +102,7 @@ TEST(CallersSettings, AreAskedOnlyWhileTheHostIsIgnored) {
     }
 }
 
-TEST(SettingsOnStandIns, AnAnswerOtherThanSuccessKeepsTheDefault) {
+TEST(AudioImportSettings, AnAnswerOtherThanSuccessKeepsTheDefault) {
     // A positive result is not success either.
     for (const TOVRESULT result : {TOV_E_FAIL, static_cast<TOVRESULT>(1)}) {
         SCOPED_TRACE(result);
@@ -120,7 +120,7 @@ TEST(SettingsOnStandIns, AnAnswerOtherThanSuccessKeepsTheDefault) {
     }
 }
 
-TEST(SettingsOnStandIns, NoSettingsObjectOrAThrowingOneLeavesTheDefault) {
+TEST(AudioImportSettings, NoSettingsObjectOrAThrowingOneLeavesTheDefault) {
     NiceMock<MockFactory> factory;
     NiceMock<MockSettings> throwing;
     ON_CALL(factory, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(ZEB_E_NOTFOUND));

@@ -21,64 +21,44 @@ using ZEB::Impl::RegisterDynamicToggles;
 using ZEB::Impl::RetrieveDynamicToggleValue;
 using ZEB::Impl::SetDynamicToggleValue;
 
-class TogglesOnAHost : public ::testing::Test {
-protected:
-    TogglesOnAHost() {
-        factory.Assign(host.Get());
-        EXPECT_EQ(host->CreateComponent(TOVCompID_FTFManager, nullptr, IID_IFTFManager, manager.Out()), TOV_OK);
-    }
-
-    unsigned int Read(const char* path, TOVRESULT expected) {
-        unsigned int value = 0;
-        EXPECT_EQ(RetrieveDynamicToggleValue(factory.Get(), path, &value), expected);
-        return value;
-    }
-
+// Registered twice, with a value set in between: the five stay in their order
+// and group, off but for the one set.
+TEST(DynamicToggles, RegisterOffInOrderAndGroupKeepingValuesAlreadyThere) {
     TestHost host;
     TOVPtr<ITOVComponentFactory> factory;
+    factory.Assign(host.Get());
     TOVPtr<IFTFManager> manager;
-};
-
-TEST_F(TogglesOnAHost, RegistersTheFiveTogglesOffInTheirOrderAndGroup) {
+    ASSERT_EQ(host->CreateComponent(TOVCompID_FTFManager, nullptr, IID_IFTFManager, manager.Out()), TOV_OK);
     RegisterDynamicToggles(factory);
-    const std::vector<std::string> expected = {
-        "/OrloReaderMovMediaContainer/MobIDFromiXML",
-        "/OrloReaderMovMediaContainer/StartTimeCodeFromFileCreationTime",
-        "/OrloReaderMovMediaContainer/IgnoreHostSettingsForUnitTest",
-        "/OrloReaderMovMediaContainer/AudioTimecodeUseBEXTOriginationDate",
-        "/OrloReaderMovMediaContainer/BigEndianSmpteIdInBEXTData",
+    ASSERT_EQ(SetDynamicToggleValue(factory, toggle_StartTimeCodeFromBEXTOriginationDate, 1), TOV_OK);
+    RegisterDynamicToggles(factory);
+    const std::pair<std::string, unsigned int> expected[] = {
+        {"/OrloReaderMovMediaContainer/MobIDFromiXML", 0},
+        {"/OrloReaderMovMediaContainer/StartTimeCodeFromFileCreationTime", 0},
+        {"/OrloReaderMovMediaContainer/IgnoreHostSettingsForUnitTest", 0},
+        {"/OrloReaderMovMediaContainer/AudioTimecodeUseBEXTOriginationDate", 1},
+        {"/OrloReaderMovMediaContainer/BigEndianSmpteIdInBEXTData", 0},
     };
     uint32_t count = 0;
     ASSERT_EQ(manager->GetToggleCount(&count), TOV_OK);
-    ASSERT_EQ(count, expected.size());
+    ASSERT_EQ(count, 5u);
     for (uint32_t index = 0; index < count; ++index) {
         ITOVString* path = nullptr;
         ASSERT_EQ(manager->GetTogglePath(index, &path), TOV_OK);
-        TOVPtr<ITOVString> owned(path);
+        TOVPtr<ITOVString> ownedPath(path);
         const std::string text = HostText::Read(path);
-        EXPECT_EQ(text, expected[index]);
+        EXPECT_EQ(text, expected[index].first);
         ITOVString* group = nullptr;
         ASSERT_EQ(manager->GetToggleGroup(text.c_str(), &group), TOV_OK);
         TOVPtr<ITOVString> ownedGroup(group);
         EXPECT_EQ(HostText::Read(group), "orrin.released.features");
-        EXPECT_EQ(Read(text.c_str(), TOV_OK), 0u);
+        unsigned int value = 9;
+        EXPECT_EQ(RetrieveDynamicToggleValue(factory.Get(), text, &value), TOV_OK);
+        EXPECT_EQ(value, expected[index].second) << text;
     }
 }
 
-TEST_F(TogglesOnAHost, RegisteringAgainKeepsEveryValueAlreadyThere) {
-    ASSERT_EQ(manager->RegisterToggle(toggle_MobIDFromiXML, 1, "host"), TOV_OK);
-    RegisterDynamicToggles(factory);
-    ASSERT_EQ(SetDynamicToggleValue(factory, toggle_StartTimeCodeFromBEXTOriginationDate, 1), TOV_OK);
-    RegisterDynamicToggles(factory);
-    EXPECT_EQ(Read(toggle_StartTimeCodeFromBEXTOriginationDate, TOV_OK), 1u);
-    EXPECT_EQ(Read(toggle_MobIDFromiXML, TOV_OK), 1u);
-    EXPECT_EQ(Read(toggle_IgnoreHostSettingsForUnitTest, TOV_OK), 0u);
-    uint32_t count = 0;
-    ASSERT_EQ(manager->GetToggleCount(&count), TOV_OK);
-    EXPECT_EQ(count, 5u);
-}
-
-TEST_F(TogglesOnAHost, NoFactoryIsNoInterfaceAndRegistersNothing) {
+TEST(DynamicToggles, NoFactoryIsNoInterfaceAndRegistersNothing) {
     TOVPtr<ITOVComponentFactory> none;
     EXPECT_NO_THROW(RegisterDynamicToggles(none));
     unsigned int value = 0;
@@ -150,7 +130,7 @@ const AccessCase kAccessCases[] = {
      TOV_E_OUTOFRANGE, TOV_E_OUTOFRANGE},
 };
 
-TEST(ToggleAccess, ReadAndSetReportEachFailureAsTheirOwn) {
+TEST(DynamicToggles, ReadAndSetReportEachFailureAsTheirOwn) {
     for (const AccessCase& c : kAccessCases) {
         SCOPED_TRACE(c.name);
         StandIns s;
@@ -162,7 +142,7 @@ TEST(ToggleAccess, ReadAndSetReportEachFailureAsTheirOwn) {
     }
 }
 
-TEST(ToggleRegistration, ThrowsTheFactorysFailureAndSkipsAMissingManager) {
+TEST(DynamicToggles, RegistrationThrowsTheFactorysFailureAndSkipsAMissingManager) {
     StandIns failing;
     ON_CALL(failing.factory, CreateComponent(_, _, _, _)).WillByDefault(FailCreation(ZEB_E_NOTFOUND));
     EXPECT_EQ(Thrown([&] { RegisterDynamicToggles(failing.held); }), ZEB_E_NOTFOUND);
@@ -173,7 +153,7 @@ TEST(ToggleRegistration, ThrowsTheFactorysFailureAndSkipsAMissingManager) {
     EXPECT_EQ(Thrown([&] { RegisterDynamicToggles(none.held); }), TOV_OK);
 }
 
-TEST(ToggleRegistration, SkipsRegisteredTogglesAndThrowsTheFirstFailure) {
+TEST(DynamicToggles, RegistrationSkipsRegisteredTogglesAndThrowsTheFirstFailure) {
     StandIns s;
     ON_CALL(s.manager, IsToggleRegistered(_)).WillByDefault(Return(0));
     ON_CALL(s.manager, IsToggleRegistered(::testing::StrEq(toggle_MobIDFromiXML))).WillByDefault(Return(1));

@@ -3,6 +3,7 @@
 #include <stdexcept>
 #include <string>
 
+#include "AudioFileWriter.h"
 #include "ClipTest.h"
 
 namespace {
@@ -26,8 +27,9 @@ struct TrackCase {
     std::vector<int> channelIndices;
     std::vector<std::pair<std::string, std::string>> trks;
 };
+void PrintTo(const TrackCase& row, std::ostream* os) { *os << row.name; }
 
-class TrackRoutes : public ClipTest, public ::testing::WithParamInterface<TrackCase> {};
+class TrackRoutes : public ClipFixture, public ::testing::WithParamInterface<TrackCase> {};
 
 TEST_P(TrackRoutes, GiveChannelIndicesAndNames) {
     const TrackCase& c = GetParam();
@@ -70,7 +72,9 @@ const TrackCase kTrackCases[] = {
 INSTANTIATE_TEST_SUITE_P(Routes, TrackRoutes, ::testing::ValuesIn(kTrackCases),
                          [](const auto& info) { return std::string(info.param.name); });
 
-TEST_F(ClipTest, BextTrkKeywordsNeverReachTheMovie) {
+using MovieTRKs = ClipFixture;
+
+TEST_F(MovieTRKs, NeverComeFromBextKeywords) {
     ClipFile file;
     file.bext = BextWith("sTRK1=Boom\r\nsTRK2=Lav\r\nsTRKA=Plant\r\n");
     const Movie movie = LoadFile(file);
@@ -78,27 +82,52 @@ TEST_F(ClipTest, BextTrkKeywordsNeverReachTheMovie) {
     EXPECT_FALSE(movie.HasMovieTRKs());
 }
 
-TEST_F(ClipTest, TracksShareTheFilesLayout) {
-    ClipFile file;
-    file.frames = 10;
-    const Movie movie = LoadFile(file);
-    ASSERT_EQ(movie.GetTrackCount(), 3u);
-    // RIFF header 12, fmt 8 + 16, data header 8: samples start at 44.
-    const uint64_t starts[] = {44, 47};
-    for (unsigned i = 1; i <= 2; ++i) {
-        const auto media = movie.GetTrack(i)->GetMedia();
-        const auto descriptor = media->GetSoundDescriptor();
-        ASSERT_NE(descriptor, nullptr);
-        EXPECT_EQ(descriptor->GetStartOffset(), starts[i - 1]);
-        EXPECT_EQ(descriptor->GetBytesPerFrame(), 6u);
-        EXPECT_FALSE(descriptor->IsBigEndian());
-        EXPECT_EQ(media->GetSampleSize(0), 6u);
-        EXPECT_EQ(media->GetSampleOffset(3), starts[i - 1] + 18);
-        EXPECT_EQ(media->GetNumberOfContiguousSamples(4), 6u);
-        EXPECT_EQ(media->GetNumberOfContiguousSamples(11), 0u);
+using TrackMedia = ClipFixture;
+
+// Ten stereo 24-bit frames, laid out by a WAVE and by an AIFF file.
+TEST_F(TrackMedia, SharesTheFilesLayoutInItsByteOrder) {
+    ClipFile wave;
+    wave.frames = 10;
+    Payload::Comm comm;
+    comm.frames = 10;
+    comm.bits = 24;
+    const struct {
+        const char* name;
+        std::string bytes;
+        uint64_t start;
+        bool bigEndian;
+    } rows[] = {
+        // RIFF header 12, fmt 8 + 16, data header 8.
+        {"take.wav", wave.Bytes(), 44, false},
+        // FORM header 12, COMM 8 + 18, SSND header 8 + offset and block size 8.
+        {"take.aif",
+         AudioFileWriter::Aiff()
+             .Chunk("COMM", Payload::CommChunk(comm))
+             .Chunk("SSND", Payload::SsndChunk(0, std::string(60, '\x10')))
+             .Bytes(),
+         54, true},
+    };
+    for (const auto& row : rows) {
+        SCOPED_TRACE(row.name);
+        Movie movie;
+        ASSERT_EQ(Load(Write(row.name, row.bytes), movie), TOV_OK);
+        ASSERT_EQ(movie.GetTrackCount(), 3u);
+        for (unsigned i = 1; i <= 2; ++i) {
+            const uint64_t start = row.start + 3 * (i - 1);
+            const auto media = movie.GetTrack(i)->GetMedia();
+            const auto descriptor = media->GetSoundDescriptor();
+            ASSERT_NE(descriptor, nullptr);
+            EXPECT_EQ(descriptor->GetStartOffset(), start);
+            EXPECT_EQ(descriptor->GetBytesPerFrame(), 6u);
+            EXPECT_EQ(descriptor->IsBigEndian(), row.bigEndian);
+            EXPECT_EQ(media->GetSampleSize(0), 6u);
+            EXPECT_EQ(media->GetSampleOffset(3), start + 18);
+            EXPECT_EQ(media->GetNumberOfContiguousSamples(4), 6u);
+            EXPECT_EQ(media->GetNumberOfContiguousSamples(11), 0u);
+        }
+        EXPECT_EQ(movie.GetTrack(0)->GetMedia()->GetSoundDescriptor(), nullptr);
+        EXPECT_THROW(movie.GetTrack(3), std::logic_error);
     }
-    EXPECT_EQ(movie.GetTrack(0)->GetMedia()->GetSoundDescriptor(), nullptr);
-    EXPECT_THROW(movie.GetTrack(3), std::logic_error);
 }
 
 TEST(MediaStart, CountsFramesWithTwoDroppedAMinuteInDrop) {

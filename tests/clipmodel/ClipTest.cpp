@@ -40,7 +40,7 @@ Payload::Bext BextWith(const std::string& keywords) {
     return bext;
 }
 
-void ClipTest::SetUp() {
+void ClipFixture::SetUp() {
     char pattern[] = "/tmp/orlo-clip-XXXXXX";
     ASSERT_NE(mkdtemp(pattern), nullptr);
     folder = pattern;
@@ -50,31 +50,31 @@ void ClipTest::SetUp() {
     host.ClearLines();
 }
 
-void ClipTest::TearDown() {
+void ClipFixture::TearDown() {
     startup.reset();
     ZEB::ZEBTerminate();
     std::filesystem::remove_all(folder);
 }
 
-std::string ClipTest::Write(const std::string& name, const std::string& bytes) {
+std::string ClipFixture::Write(const std::string& name, const std::string& bytes) {
     const std::filesystem::path path = std::filesystem::path(folder) / name;
     std::filesystem::create_directories(path.parent_path());
     std::ofstream(path, std::ios::binary) << bytes;
     return path.string();
 }
 
-TOVRESULT ClipTest::Load(const std::string& path, OrloReader::Movie& movie) {
+TOVRESULT ClipFixture::Load(const std::string& path, OrloReader::Movie& movie) {
     return movie.InitFromFile(ZEB::ZEBString(reinterpret_cast<const unsigned char*>(path.c_str())), host.Get(), true);
 }
 
-OrloReader::Movie ClipTest::LoadFile(const ClipFile& file, const std::string& name) {
+OrloReader::Movie ClipFixture::LoadFile(const ClipFile& file, const std::string& name) {
     OrloReader::Movie movie;
     const TOVRESULT result = Load(Write(name, file.Bytes()), movie);
     EXPECT_EQ(result, TOV_OK);
     return movie;
 }
 
-void ClipTest::SetToggle(const char* path, unsigned int value) {
+void ClipFixture::SetToggle(const char* path, unsigned int value) {
     TOVPtr<ITOVComponentFactory> factory;
     factory.Assign(host.Get());
     ASSERT_EQ(ZEB::Impl::SetDynamicToggleValue(factory, path, value), TOV_OK);

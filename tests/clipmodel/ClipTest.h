@@ -35,7 +35,7 @@ std::string Ixml(const std::string& body);
 /// with no date, time or time reference unless the test sets them.
 Payload::Bext BextWith(const std::string& keywords);
 
-class ClipTest : public ::testing::Test {
+class ClipFixture : public ::testing::Test {
 protected:
     void SetUp() override;
     void TearDown() override;

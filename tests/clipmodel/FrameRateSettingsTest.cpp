@@ -19,7 +19,7 @@ struct Case {
     bool drop;
 };
 
-TEST(FrameRateSettingsTest, EachWayInSetsRateFpsAndDrop) {
+TEST(FrameRateSettings, EachWayInSetsRateFpsAndDrop) {
     const Case cases[] = {
         {"rational 29.97 drop", FrameRateSettings(_aafRational_t{30000, 1001}, true), 30000, 1001, 30000.0 / 1001,
          true},
@@ -42,7 +42,7 @@ TEST(FrameRateSettingsTest, EachWayInSetsRateFpsAndDrop) {
     }
 }
 
-TEST(FrameRateSettingsTest, SetDropFrameStandsAloneButSettersApplyTheRule) {
+TEST(FrameRateSettings, SetDropFrameStandsAloneButSettersApplyTheRule) {
     FrameRateSettings settings(_aafRational_t{30000, 1001}, true);
     settings.SetFloatingFramerate(25.0, true);
     EXPECT_EQ(settings.GetRationalFramerate().numerator, 25);

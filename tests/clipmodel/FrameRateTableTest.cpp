@@ -20,7 +20,7 @@ struct RateCase {
                                          << "/" << denominator;
 }
 
-TEST(FrameRateTableTest, RationalRateFromFPS) {
+TEST(FrameRateTable, RationalRateFromFPS) {
     // Table rows, searched from the truncated low bound; between rows, and
     // from 100000 up, rounded; three times a frame rate from 69 to under 183,
     // then four times.
@@ -43,7 +43,7 @@ TEST(FrameRateTableTest, RationalRateFromFPS) {
     }
 }
 
-TEST(FrameRateTableTest, StringToFrameRateReadsTheNumberAndTheDropMark) {
+TEST(FrameRateTable, StringToFrameRateReadsTheNumberAndTheDropMark) {
     struct Case {
         const char* text;
         int numerator;
@@ -67,7 +67,7 @@ TEST(FrameRateTableTest, StringToFrameRateReadsTheNumberAndTheDropMark) {
     }
 }
 
-TEST(FrameRateTableTest, StringToFrameRateRefusesOtherNumbersAndWritesNothing) {
+TEST(FrameRateTable, StringToFrameRateRefusesOtherNumbersAndWritesNothing) {
     for (const char* text : {"48", "61", "0", "", "DF29.97", "1e300"}) {
         SCOPED_TRACE(text);
         _aafRational_t rate{7, 9};
@@ -78,9 +78,9 @@ TEST(FrameRateTableTest, StringToFrameRateRefusesOtherNumbersAndWritesNothing) {
     }
 }
 
-using VideoFormatTest = StartedLibraryTest;
+using VideoFormatName = StartedLibraryTest;
 
-TEST_F(VideoFormatTest, StringToFrameRateFindsOnlyTheExactName) {
+TEST_F(VideoFormatName, StringToFrameRateFindsOnlyTheExactName) {
     struct Case {
         const char* text;
         unsigned short fps;

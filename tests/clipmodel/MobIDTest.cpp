@@ -33,7 +33,10 @@ std::string BextUmid() {
     return umid + std::string(32, '\x55');
 }
 
-TEST_F(ClipTest, RoutesAreTriedInOrderOfTrust) {
+using MobID = ClipFixture;
+using HashBuffer = ClipFixture;
+
+TEST_F(MobID, RoutesAreTriedInOrderOfTrust) {
     const std::string fileUid = "RCD2024051713451000000001ABCDEFGHIJK";  // 36 characters
     ClipFile file;
     file.bext = BextWith("");
@@ -84,7 +87,7 @@ TEST_F(ClipTest, RoutesAreTriedInOrderOfTrust) {
     EXPECT_EQ(Head(id), HeadBytes());
 }
 
-TEST_F(ClipTest, DigestIdentityFollowsContentAndNameNotFolder) {
+TEST_F(MobID, DigestFollowsContentAndNameNotFolder) {
     const std::string bytes = ClipFile{}.Bytes();
     Movie first, moved, renamed;
     ASSERT_EQ(Load(Write("day1/take.wav", bytes), first), TOV_OK);
@@ -96,7 +99,7 @@ TEST_F(ClipTest, DigestIdentityFollowsContentAndNameNotFolder) {
     EXPECT_NE(first.GetMobID(), renamed.GetMobID());
 }
 
-TEST_F(ClipTest, BufferForHashBlockSizesAndPlaces) {
+TEST_F(HashBuffer, BlockSizesAndPlaces) {
     const struct { size_t size, block; } cases[] = {{200, 64}, {191, 64}, {12288, 4032}, {12289, 4096}};
     for (const auto& c : cases) {
         std::string bytes(c.size, '\0');
@@ -127,7 +130,7 @@ TEST(MobIdMaterial, IsValidOnlyWithEveryFieldSet) {
     for (const _aafUID_t& uid : cases) EXPECT_FALSE(OrloReader::IsMobIdMaterialValid(uid)) << uid.Data1;
 }
 
-TEST_F(ClipTest, AFileTooSmallToDigestHasNoIdentity) {
+TEST_F(MobID, AFileTooSmallToDigestHasNone) {
     // fmt and an empty data chunk: 44 bytes, below one 64-byte block.
     ClipFile file;
     file.frames = 0;

@@ -5,7 +5,6 @@
 #include "ClipTest.h"
 #include "boundary/ModuleGlobals.h"
 #include "boundary/OrloConstants.h"
-#include "clipmodel/AddTimeCodeFromMetadata.h"
 
 namespace {
 
@@ -25,6 +24,7 @@ struct StartCase {
     std::string reportRate, reportSource, reportStart;
     bool hasStartOffset;
 };
+void PrintTo(const StartCase& row, std::ostream* os) { *os << row.name; }
 
 std::string Text(const OrloReader::TimeCodeInfo& tc) {
     std::string text;
@@ -36,7 +36,7 @@ std::string RateText(const _aafRational_t& rate) {
     return std::to_string(rate.numerator) + "/" + std::to_string(rate.denominator);
 }
 
-class StartTimecode : public ClipTest, public ::testing::WithParamInterface<StartCase> {};
+class StartTimecode : public ClipFixture, public ::testing::WithParamInterface<StartCase> {};
 
 TEST_P(StartTimecode, ComesFromTheMostTrustedSource) {
     const StartCase& c = GetParam();
@@ -123,7 +123,7 @@ const StartCase kStartCases[] = {
 INSTANTIATE_TEST_SUITE_P(Sources, StartTimecode, ::testing::ValuesIn(kStartCases),
                          [](const auto& info) { return std::string(info.param.name); });
 
-TEST_F(ClipTest, FileCreationTimeToggleGivesAStartWhenNothingElseDoes) {
+TEST_F(StartTimecode, FileCreationTimeToggleGivesAStartWhenNothingElseDoes) {
     SetToggle(toggle_StartTimeCodeFromFileCreationTime, 1);
     const Movie movie = LoadFile(ClipFile{});
     EXPECT_EQ(host.Texts().back(),
@@ -132,7 +132,7 @@ TEST_F(ClipTest, FileCreationTimeToggleGivesAStartWhenNothingElseDoes) {
     EXPECT_EQ(movie.GetMovieTimeCode().GetFrames(), 0);
 }
 
-TEST_F(ClipTest, FileTimeCodeOnlyWithATape) {
+TEST_F(StartTimecode, FileTimeCodeOnlyWithATape) {
     ClipFile file;
     file.ixml = Ixml(Speed("25/1", ""));
     EXPECT_FALSE(LoadFile(file).HasMovieFileTimeCode());
@@ -144,53 +144,30 @@ TEST_F(ClipTest, FileTimeCodeOnlyWithATape) {
     EXPECT_EQ(movie.GetMovieEditRate().denominator, 1);
 }
 
-const std::string kMismatchIxml = Speed("", "", "48000", "48000");
-
-TEST_F(ClipTest, DisagreeingTimeReferencesAreNotedAndIxmlWins) {
+// iXML says one second, bext two: the clip takes iXML's and notes the
+// mismatch, which is the only report whose failure fails the clip.
+TEST_F(StartTimecode, DisagreeingTimeReferencesAreNotedAndIxmlWins) {
     ClipFile file;
     file.bext = BextWith("sSCENE=1\r\n");
     file.bext->timeReference = 96000;
-    file.ixml = Ixml(kMismatchIxml);
+    file.ixml = Ixml(Speed("", "", "48000", "48000"));
     const Movie movie = LoadFile(file);
     const auto texts = host.Texts();
     ASSERT_EQ(texts.size(), 2u);
     EXPECT_EQ(texts[0], "Note: iXML time reference and BEXT time reference do not match.");
     EXPECT_EQ(host.Lines()[0].first, 2u);
     EXPECT_EQ(movie.GetMovieStartOffset(), 48000);
-}
 
-TEST_F(ClipTest, WithoutAConsoleOnlyTheMismatchNoteFailsTheClip) {
+    host.ClearLines();
     g_pConsole->Release();
     g_pConsole = nullptr;
-    ClipFile file;
-    file.bext = BextWith("sSCENE=1\r\n");
-    file.bext->timeReference = 96000;
-    file.ixml = Ixml(kMismatchIxml);
     Movie failed;
     EXPECT_EQ(Load(Write("mismatch.wav", file.Bytes()), failed), TOV_E_POINTER);
-
     // Agreeing references need no note, and the missing report is no failure.
     file.bext->timeReference = 48000;
-    Movie movie;
-    EXPECT_EQ(Load(Write("agree.wav", file.Bytes()), movie), TOV_OK);
+    Movie agreeing;
+    EXPECT_EQ(Load(Write("agree.wav", file.Bytes()), agreeing), TOV_OK);
     EXPECT_TRUE(host.Texts().empty());
-}
-
-TEST(ChooseFrameRate, TakesNothingFromNullSources) {
-    _aafRational_t rate{7, 7};
-    bool drop = true;
-    EXPECT_FALSE(OrloReader::ChooseFrameRateFromFileAttributes(nullptr, nullptr, true, rate, drop, nullptr));
-    EXPECT_EQ(rate.numerator, 7);
-
-    Chunks::IXML::IXMLSpeed speed;
-    speed.SetTimeCodeRate({60000, 1001});
-    speed.SetHasTimeCodeRate(true);
-    speed.SetTimeCodeFlag(true);
-    speed.SetHasTimeCodeFlag(true);
-    const char* source = nullptr;
-    EXPECT_TRUE(OrloReader::ChooseFrameRateFromFileAttributes(&speed, nullptr, true, rate, drop, &source));
-    EXPECT_TRUE(drop);
-    EXPECT_STREQ(source, "iXML");
 }
 
 }  // namespace

@@ -11,14 +11,11 @@ namespace {
 
 using namespace OrloReader;
 
-TEST(TextFormsTest, NumbersAndRationals) {
-    // Printed as signed.
+// Numbers print as signed, rationals denominator first, Mob IDs without label
+// bytes 6 to 11, and time stamps with the year in the day's place.
+TEST(DiagnosticText, KeepsItsOwnOrders) {
     EXPECT_EQ(ToString(ULLONG_MAX), "-1");
-    // The denominator first.
     EXPECT_EQ(ToString(_aafRational_t{30000, 1001}), "1001/30000");
-}
-
-TEST(TextFormsTest, MobIDLeavesOutLabelBytesSixToEleven) {
     _aafMobID_t id{};
     const unsigned char label[12] = {0x06, 0x0A, 0x2B, 0x34, 0x01, 0x01, 0xEE, 0xEE, 0xEE, 0xEE, 0xEE, 0xEE};
     std::copy(label, label + 12, id.SMPTELabel);
@@ -34,9 +31,13 @@ TEST(TextFormsTest, MobIDLeavesOutLabelBytesSixToEleven) {
               "9ABC"
               "DEF0"
               "01020304050607FF");
+    _aafTimeStamp_t stamp{};
+    stamp.date = {2016, 3, 7};
+    stamp.time = {9, 5, 1, 42};
+    EXPECT_EQ(ToString(stamp), "2016-03-2016T09:05:01+00:00");
 }
 
-TEST(TextFormsTest, TimeCodeInfoMarksDropFrameAndOddHalvesOnlyInItsOwnForm) {
+TEST(TimeCodeInfoText, MarksDropFrameAndOddHalvesOnlyInItsOwnForm) {
     const struct {
         TimeCodeInfo info;
         const char* text;
@@ -62,30 +63,20 @@ TEST(TextFormsTest, TimeCodeInfoMarksDropFrameAndOddHalvesOnlyInItsOwnForm) {
     EXPECT_EQ(ToString(TimeCodeInfo(1, 2, 3, 5, 60, true)), "01:02:03:05");
 }
 
-TEST(TextFormsTest, TimeStampRepeatsTheYearInTheDaysPlace) {
-    _aafTimeStamp_t stamp{};
-    stamp.date = {2016, 3, 7};
-    stamp.time = {9, 5, 1, 42};
-    EXPECT_EQ(ToString(stamp), "2016-03-2016T09:05:01+00:00");
-}
+using UIDText = StartedLibraryTest;
+using TimecodeText = StartedLibraryTest;
 
-using TextParseTest = StartedLibraryTest;
-
-TEST_F(TextParseTest, UIDToTextAndBack) {
+TEST_F(UIDText, ReadsBackAndKeepsZeroWhereTheTextStops) {
     const _tovUID uid{0x12345678, 0x9ABC, 0xDEF0, {0x01, 0x02, 0x03, 0x04, 0x05, 0x06, 0x07, 0xFF}};
     const std::string text = ToString(uid);
     EXPECT_EQ(text, "urn:uuid:12345678-9abc-def0-0102-0304050607ff");
     EXPECT_EQ(StringToUID(Text(text.c_str())), uid);
     EXPECT_EQ(StringToUID(Text("urn:uuid:12345678-9ABC-DEF0-0102-0304050607FF")), uid);
-}
-
-TEST_F(TextParseTest, StringToUIDKeepsZeroWhereTheTextStops) {
-    const _tovUID partial = StringToUID(Text("urn:uuid:12345678-9abc"));
-    EXPECT_EQ(partial, (_tovUID{0x12345678, 0x9ABC, 0, {}}));
+    EXPECT_EQ(StringToUID(Text("urn:uuid:12345678-9abc")), (_tovUID{0x12345678, 0x9ABC, 0, {}}));
     EXPECT_EQ(StringToUID(Text("uuid:12345678")), _tovUID{});
 }
 
-TEST_F(TextParseTest, StringToTimecodeFillsFromTheRight) {
+TEST_F(TimecodeText, FillsFromTheRight) {
     struct Case {
         const char* text;
         int hours, minutes, seconds, frames;
@@ -111,7 +102,7 @@ TEST_F(TextParseTest, StringToTimecodeFillsFromTheRight) {
     }
 }
 
-TEST(TextFormsTest, TimeCodeToTimeCodeInfoKeepsTheCount) {
+TEST(TimeCodeToTimeCodeInfo, KeepsTheCount) {
     const Timecode::timecodeDesc_t drop = Timecode::TCCreateDesc(1, 30);
     TimeCodeInfo info;
     TimeCodeToTimeCodeInfo(Timecode::TCCreateDur(1800, &drop), info);
@@ -130,7 +121,7 @@ TEST(TextFormsTest, TimeCodeToTimeCodeInfoKeepsTheCount) {
     EXPECT_EQ(info.GetTotalFrames(), 25 * 86400 + 26);
 }
 
-TEST(TextFormsTest, TimeToSamplesTruncates) {
+TEST(TimeToSamples, Truncates) {
     unsigned long long samples = 0;
     TimeToSamples(1, 2, 3, 48000, samples);
     EXPECT_EQ(samples, 3723ull * 48000);

@@ -12,7 +12,7 @@ namespace {
 
 using namespace HelperFunctions;
 
-TEST(TextHelpersTest, HexDumpFromMemory) {
+TEST(HexDumpFromMemory, WritesPairsOfDigits) {
     const char bytes[] = {'\x00', '\x0f', '\xa0', '\xff', 'A', 'z'};
     EXPECT_EQ(HexDumpFromMemory(bytes, 6), "000fa0ff417a");
     // An odd length or no data give nothing at all.
@@ -20,7 +20,7 @@ TEST(TextHelpersTest, HexDumpFromMemory) {
     EXPECT_EQ(HexDumpFromMemory(nullptr, 4), "");
 }
 
-TEST(TextHelpersTest, TrimFromBeginningAndEnd) {
+TEST(TrimFromBeginningAndEnd, TrimsOnlyTheGivenCharacter) {
     struct Case {
         const char* text;
         char c;
@@ -35,7 +35,7 @@ TEST(TextHelpersTest, TrimFromBeginningAndEnd) {
     for (const Case& c : cases) EXPECT_EQ(TrimFromBeginningAndEnd(c.text, c.c), c.trimmed) << c.text;
 }
 
-TEST(TextHelpersTest, GetFullFileNameFromPath) {
+TEST(GetFullFileNameFromPath, TakesEitherSlash) {
     struct Case {
         const char* path;
         const char* name;
@@ -49,14 +49,14 @@ TEST(TextHelpersTest, GetFullFileNameFromPath) {
     for (const Case& c : cases) EXPECT_EQ(GetFullFileNameFromPath(c.path), c.name) << c.path;
 }
 
-TEST(TextHelpersTest, IsKeywordTRK) {
+TEST(IsKeywordTRK, WantsOneOrTwoDigits) {
     for (const char* key : {"TRK0", "TRK99"}) EXPECT_TRUE(IsKeywordTRK(key)) << key;
     for (const char* key : {"TRK", "TRK123", "TRK1a", "trk1", "TRX1", "TRK-1"}) {
         EXPECT_FALSE(IsKeywordTRK(key)) << key;
     }
 }
 
-TEST(TextHelpersTest, TruncateTowardsZeroInRangeLowestOutside) {
+TEST(TruncateToInteger, TowardsZeroInRangeLowestOutside) {
     EXPECT_EQ(TruncateToInt32(-2.9), -2);
     EXPECT_EQ(TruncateToInt32(2147483647.9), INT32_MAX);
     EXPECT_EQ(TruncateToInt32(2147483648.0), INT32_MIN);

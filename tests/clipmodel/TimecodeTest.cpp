@@ -42,7 +42,7 @@ const CountCase kCountCases[] = {
     {60, true, 35964, {0, 0, 10, 0, 0}},  {30, false, 1800, {0, 0, 1, 0, 0}},  {25, false, 90012, {0, 1, 0, 0, 12}},
 };
 
-TEST(TimecodeTest, CountsAndDisplayedFieldsMatchBothWays) {
+TEST(Timecode, CountsAndDisplayedFieldsMatchBothWays) {
     for (const CountCase& c : kCountCases) {
         SCOPED_TRACE(testing::Message() << c.fps << (c.drop ? " DF " : " NDF ") << c.count);
         const timecode_t tc = Make(c.count, c.fps, c.drop);
@@ -55,7 +55,7 @@ TEST(TimecodeTest, CountsAndDisplayedFieldsMatchBothWays) {
     }
 }
 
-TEST(TimecodeTest, EveryDropFrameCountOfTwoHoursSurvivesTheRoundTrip) {
+TEST(Timecode, EveryDropFrameCountOfTwoHoursSurvivesTheRoundTrip) {
     for (const unsigned short fps : {30, 60}) {
         const timecodeDesc_t desc = TCCreateDesc(1, fps);
         int mismatches = 0;
@@ -69,7 +69,7 @@ TEST(TimecodeTest, EveryDropFrameCountOfTwoHoursSurvivesTheRoundTrip) {
     }
 }
 
-TEST(TimecodeTest, RateZeroReadsAsThirtyNonDrop) {
+TEST(Timecode, RateZeroReadsAsThirtyNonDrop) {
     timecode_t tc{{TCDropFrameFlag, 0, 0, 0}, 1800};
     EXPECT_EQ(Split(tc), (Fields{0, 0, 1, 0, 0}));
     const timecode_t built = TCConstruct(0, 0, 1, 0, 0, nullptr);
@@ -91,7 +91,7 @@ TEST(TimecodeTest, RateZeroReadsAsThirtyNonDrop) {
     EXPECT_EQ(other.count, 25);
 }
 
-TEST(TimecodeTest, ConstructionClearsADropBitTheRateCannotHave) {
+TEST(Timecode, ConstructionClearsADropBitTheRateCannotHave) {
     const timecodeDesc_t forced{TCDropFrameFlag | 0x10, 25, 7, 9};
     const timecode_t built = TCConstruct(0, 0, 1, 0, 0, &forced);
     EXPECT_EQ(built.count, 1500);
@@ -108,7 +108,7 @@ struct ChangeCase {
     bool drop;
 };
 
-TEST(TimecodeTest, ConvertFPSKeepsTheDisplayAndScalesTheFrames) {
+TEST(Timecode, ConvertFPSKeepsTheDisplayAndScalesTheFrames) {
     const ChangeCase cases[] = {
         {"25 to 50 doubles the frames", Make(90012, 25, false), 50, 180024, false},
         {"24 to 30 rounds 28.75 up", Make(23, 24, false), 30, 29, false},
@@ -129,7 +129,7 @@ TEST(TimecodeTest, ConvertFPSKeepsTheDisplayAndScalesTheFrames) {
     }
 }
 
-TEST(TimecodeTest, ChangeDropKeepsTheDisplayedTimecode) {
+TEST(Timecode, ChangeDropKeepsTheDisplayedTimecode) {
     const ChangeCase cases[] = {
         {"30 NDF 00:01:00:00 to DF", Make(1800, 30, false), 1, 1798, true},
         {"30 DF 00:01:00:02 to NDF", Make(1800, 30, true), 0, 1802, false},
@@ -159,7 +159,7 @@ struct SamplesCase {
     int count;  // at fpsOut and dropOut
 };
 
-TEST(TimecodeTest, SamplesToTCCountsOneSampleMore) {
+TEST(Timecode, SamplesToTCCountsOneSampleMore) {
     const SamplesCase cases[] = {
         {"last sample of the first second", 47999, 48000, 24, 24, false, 24, false, 24},
         {"one hour at 25", 172800000, 48000, 25, 25, false, 25, false, 90000},
@@ -180,7 +180,7 @@ TEST(TimecodeTest, SamplesToTCCountsOneSampleMore) {
     EXPECT_EQ(Split(SamplesToTC(2882880, 48000, 30000.0 / 1001, 30, 1, 30, 1)), (Fields{0, 0, 1, 0, 2}));
 }
 
-TEST(TimecodeTest, TCToSamplesRoundsHalfUp) {
+TEST(Timecode, TCToSamplesRoundsHalfUp) {
     EXPECT_EQ(TCToSamples(Make(90000, 25, false), 48000, 25), 172800000);
     // 1601.6 samples per frame at 29.97.
     EXPECT_EQ(TCToSamples(Make(1, 30, true), 48000, 30000.0 / 1001), 1602);

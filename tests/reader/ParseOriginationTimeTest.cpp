@@ -12,7 +12,7 @@ struct TimeRow {
     short hours, minutes, seconds;  // after the call; the caller starts at (callerHours, 0, 7)
 };
 
-TEST(ParseOriginationTimeTest, Rows) {
+TEST(ParseOriginationTime, SeparatorsAndCarries) {
     const TimeRow rows[] = {
         {"12:34:56", 0, true, 12, 34, 56},
         {"12-34-56", 0, true, 12, 34, 56},

@@ -9,7 +9,7 @@
 #include "TestHost.h"
 #include "reader/OrloStream.h"
 
-class ReaderTest : public ::testing::Test {
+class ReaderFixture : public ::testing::Test {
 protected:
     void SetUp() override;
     void TearDown() override;
@@ -22,6 +22,3 @@ protected:
 
     TestHost host;
 };
-
-/// How many descriptors the process holds open.
-int OpenDescriptorCount();

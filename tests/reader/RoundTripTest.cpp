@@ -24,13 +24,9 @@ const Format kFormats[] = {
     {"Wave24", Container::Wave, 24, false, "", false},
     {"Wave32", Container::Wave, 32, false, "", false},
     {"WaveFloat", Container::Wave, 32, true, "", false},
-    {"Extensible16", Container::WaveExtensible, 16, false, "", false},
     {"Extensible24", Container::WaveExtensible, 24, false, "", false},
-    {"Extensible32", Container::WaveExtensible, 32, false, "", false},
     {"ExtensibleFloat", Container::WaveExtensible, 32, true, "", false},
-    {"RF64_16", Container::RF64, 16, false, "", false},
     {"RF64_24", Container::RF64, 24, false, "", false},
-    {"RF64_32", Container::RF64, 32, false, "", false},
     {"RF64Float", Container::RF64, 32, true, "", false},
     {"BroadcastWave24", Container::BroadcastWave, 24, false, "", false},
     {"Aiff16", Container::Aiff, 16, false, "", true},
@@ -39,7 +35,6 @@ const Format kFormats[] = {
     {"AifcNone24", Container::Aifc, 24, false, "NONE", true},
     {"AifcSowt16", Container::Aifc, 16, false, "sowt", false},
     {"AifcSowt24", Container::Aifc, 24, false, "sowt", false},
-    {"AifcSowt32", Container::Aifc, 32, false, "sowt", false},
     {"AifcIn16", Container::Aifc, 16, false, "in16", true},
     {"AifcIn24", Container::Aifc, 24, false, "in24", true},
     {"AifcIn32", Container::Aifc, 32, false, "in32", true},
@@ -90,7 +85,9 @@ std::string Write(const Format& format, uint16_t channels) {
     return writer.Chunk("fmt ", Payload::FmtChunk(fmt)).Chunk("data", samples).Bytes();
 }
 
-TEST_F(ReaderTest, EveryFormatReadsBackAsWritten) {
+using SampleLayout = ReaderFixture;
+
+TEST_F(SampleLayout, EveryFormatReadsBackAsWritten) {
     for (const Format& format : kFormats) {
         for (uint16_t channels : {1, 2, 6}) {
             SCOPED_TRACE(std::string(format.name) + " × " + std::to_string(channels));
@@ -106,6 +103,8 @@ TEST_F(ReaderTest, EveryFormatReadsBackAsWritten) {
             EXPECT_EQ(stream->GetSampleSize(), sampleSize);
             EXPECT_EQ(stream->GetIsDataWrongEndian(), format.dataWrongEndian);
             EXPECT_EQ(stream->IsRF64(), format.container == Container::RF64);
+            EXPECT_EQ(stream->IsFileWrongEndian(), format.container >= Container::Aiff);
+            EXPECT_EQ(stream->GetBytesRemaining(), -1) << "the file is closed after construction";
             for (uint32_t frame : {0u, 1u, kFrames - 1}) {
                 const int64_t at = stream->GetSamplePosition(frame);
                 ASSERT_LE(at + size_t{channels} * sampleSize, bytes.size());

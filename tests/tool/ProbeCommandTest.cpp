@@ -47,7 +47,7 @@ std::string Hex(const std::string& bytes) {
     return out;
 }
 
-TEST(ProbeCommandTest, ExampleTakeMatchesGolden) {
+TEST(ProbeCommand, ExampleTakeMatchesGolden) {
     Json report = ProbeJson(kExample);
     // The path as given is the only thing that depends on the machine.
     ASSERT_EQ(report["file"], kExample);
@@ -63,41 +63,28 @@ TEST(ProbeCommandTest, ExampleTakeMatchesGolden) {
     EXPECT_EQ(dump, golden.str()) << "output differs from " << path;
 }
 
-TEST(ProbeCommandTest, TogglesChooseWhereTheMobIDComesFrom) {
+// Toggles choose where the Mob ID comes from, and the grouping setting reaches
+// the plug-in unless a toggle has it make no settings object.
+TEST(ProbeCommand, TogglesAndTheGroupingSettingReachThePlugin) {
     const std::string umid = ExampleTake::BextPayload().substr(348, 32);
     const struct {
         std::string arguments;
-        std::string mobID;
+        const char* key;
+        Json value;
     } cases[] = {
-        // The bext UMID with its material fields turned into the machine's order.
-        {"", Hex(umid.substr(0, 16)) +
-                 "117C2B5E"
-                 "034A"
-                 "EF11" +
-                 Hex(umid.substr(24, 8))},
-        {Toggle(toggle_BigEndianSmpteIdInBEXTData, 1), Hex(umid)},
+        // The bext UMID with its material fields (Data1, Data2, Data3) turned into the machine's order.
+        {"", "mobID", Hex(umid.substr(0, 16)) + "117C2B5E034AEF11" + Hex(umid.substr(24, 8))},
+        {Toggle(toggle_BigEndianSmpteIdInBEXTData, 1), "mobID", Hex(umid)},
         // The iXML FILE_UID's first 32 characters taken as bytes.
-        {Toggle(toggle_MobIDFromiXML, 7), Hex("ORL12A0003D20240517T134510A1B2C3")},
+        {Toggle(toggle_MobIDFromiXML, 7), "mobID", Hex("ORL12A0003D20240517T134510A1B2C3")},
+        {"", "groupingAllowed", true},
+        {"--no-autodetect-groups", "groupingAllowed", false},
+        {"--no-autodetect-groups " + Toggle(toggle_IgnoreHostSettingsForUnitTest, 1), "groupingAllowed", true},
     };
-    for (const auto& c : cases) EXPECT_EQ(ProbeJson(c.arguments + " " + kExample)["mobID"], c.mobID) << c.arguments;
+    for (const auto& c : cases) EXPECT_EQ(ProbeJson(c.arguments + " " + kExample)[c.key], c.value) << c.arguments;
 }
 
-TEST(ProbeCommandTest, GroupingSettingReachesThePlugin) {
-    const std::string ignore = Toggle(toggle_IgnoreHostSettingsForUnitTest, 1);
-    const struct {
-        std::string arguments;
-        bool allowed;
-    } cases[] = {
-        {"", true},
-        {"--no-autodetect-groups", false},
-        // With the toggle the plug-in makes no settings object and keeps its default.
-        {"--no-autodetect-groups " + ignore, true},
-    };
-    for (const auto& c : cases)
-        EXPECT_EQ(ProbeJson(c.arguments + " " + kExample)["groupingAllowed"], c.allowed) << c.arguments;
-}
-
-TEST(ProbeCommandTest, UsageErrorsExit2AndSayWhy) {
+TEST(ProbeCommand, UsageErrorsExit2AndSayWhy) {
     const struct {
         std::string arguments;
         const char* message;
@@ -114,7 +101,7 @@ TEST(ProbeCommandTest, UsageErrorsExit2AndSayWhy) {
     }
 }
 
-TEST(ProbeCommandTest, FileThePluginCannotReadFailsWithItsCodeAndReason) {
+TEST(ProbeCommand, FileThePluginCannotReadFailsWithItsCodeAndReason) {
     TempFile text("This is a shot list, not a recording.\n");
     const Json report = ProbeJson(text.Path(), 1);
     EXPECT_EQ(report["result"], "0x8000FFFF");
@@ -131,7 +118,7 @@ TEST(ProbeCommandTest, FileThePluginCannotReadFailsWithItsCodeAndReason) {
     EXPECT_EQ(Probe("/nonexistent/take.wav").status, 1);
 }
 
-TEST(ProbeCommandTest, TextShowsAlignedClipLinesAndATrackTable) {
+TEST(ProbeCommand, TextShowsAlignedClipLinesAndATrackTable) {
     const ToolOutcome outcome = Probe(kExample);
     ASSERT_EQ(outcome.status, 0);
     std::istringstream lines(outcome.out);

@@ -17,7 +17,7 @@ struct Case {
     uint32_t value;
 };
 
-TEST(ToggleSettingTest, AcceptsTheFiveTogglesWithUnsignedValues) {
+TEST(ToggleSetting, AcceptsTheFiveTogglesWithUnsignedValues) {
     const std::string origination = toggle_StartTimeCodeFromBEXTOriginationDate;
     const Case cases[] = {
         {std::string(toggle_StartTimeCodeFromFileCreationTime) + "=0", nullptr, 0},
@@ -48,7 +48,7 @@ TEST(ToggleSettingTest, AcceptsTheFiveTogglesWithUnsignedValues) {
     }
 }
 
-TEST(ToggleSettingTest, AnUnknownPathListsTheKnownOnes) {
+TEST(ToggleSetting, AnUnknownPathListsTheKnownOnes) {
     ToggleSetting toggle;
     const std::string problem = ToggleSetting::Parse("/Nope=1", toggle);
     for (const char* path :
@@ -65,7 +65,7 @@ _aafMobID_t Filled(unsigned char (*byte)(int)) {
     return id;
 }
 
-TEST(MobIDTextTest, ReadsBackIntoTheSameBytes) {
+TEST(MobIDText, ReadsBackIntoTheSameBytes) {
     const _aafMobID_t ids[] = {
         Filled([](int) -> unsigned char { return 0xFF; }),
         Filled([](int i) -> unsigned char { return static_cast<unsigned char>(i * 37 + 11); }),

@@ -10,9 +10,9 @@ namespace {
 
 using Chunks::IXML::IXMLChunk;
 
-class IXMLChunkTest : public ReaderTest {
+class IxmlChunk : public ReaderFixture {
 protected:
-    // A stereo WAVE whose iXML chunk carries `xml`, laid out by `write`.
+    // A stereo WAVE whose iXML chunk carries `xml`.
     std::string Wave(const std::string& xml) {
         return AudioFileWriter::Wave()
             .Chunk("fmt ", Payload::FmtChunk({}))
@@ -28,7 +28,7 @@ struct Repair {
     std::string read;
 };
 
-TEST_F(IXMLChunkTest, TextIsMendedBeforeAnyoneParsesIt) {
+TEST_F(IxmlChunk, TextIsMendedBeforeAnyoneParsesIt) {
     const Repair cases[] = {
         {"as written", "<BWFXML><SCENE>1</SCENE></BWFXML>", "<BWFXML><SCENE>1</SCENE></BWFXML>"},
         {"padding behind the root", std::string("<BWFXML/>") + std::string(37, '\0'), "<BWFXML/>"},
@@ -38,6 +38,7 @@ TEST_F(IXMLChunkTest, TextIsMendedBeforeAnyoneParsesIt) {
         {"only the first misspelling", "<?xml encording=\"UTF-8\"?><BWFXML><NOTE>encording</NOTE></BWFXML>",
          "<?xml encoding=\"UTF-8\"?><BWFXML><NOTE>encording</NOTE></BWFXML>"},
         {"odd size gains its pad byte, then loses it", "<BWFXML/>", "<BWFXML/>"},
+        {"even text without markup kept whole", "no markup.", "no markup."},
     };
     for (const Repair& c : cases) {
         auto stream = Open(Wave(c.written));
@@ -47,14 +48,14 @@ TEST_F(IXMLChunkTest, TextIsMendedBeforeAnyoneParsesIt) {
     }
 }
 
-TEST_F(IXMLChunkTest, AnEmptyChunkIsAsIfItWereNotThere) {
+TEST_F(IxmlChunk, AnEmptyChunkIsAsIfItWereNotThere) {
     auto stream = Open(Wave(""));
     ASSERT_EQ(stream->GetError(), nullptr);
     EXPECT_FALSE(stream->HasChunk(Orlo::OrloStream::IXML_CHUNK));
     EXPECT_EQ(stream->GetSampleCount(), 2u) << "the walk goes on behind it";
 }
 
-TEST_F(IXMLChunkTest, ATruncatedChunkFailsTheStream) {
+TEST_F(IxmlChunk, ATruncatedChunkFailsTheStream) {
     const std::string file = AudioFileWriter::Wave()
                                  .Chunk("fmt ", Payload::FmtChunk({}))
                                  .ChunkWithSize("iXML", 4096, "<BWFXML>", false)

@@ -12,7 +12,7 @@ using ZEB::ZEBString;
 
 ZEBString Z(const char* text) { return ZEBString(reinterpret_cast<const unsigned char*>(text)); }
 
-class IXMLTextParsers : public ReaderTest {};
+class IXMLTextParsers : public ReaderFixture {};
 
 TEST_F(IXMLTextParsers, FrameRates) {
     const struct {
@@ -72,18 +72,14 @@ TEST_F(IXMLTextParsers, WordsAreExactCapitals) {
     }
 }
 
-TEST_F(IXMLTextParsers, SamplesSinceMidnightJoinTwoHalves) {
+TEST_F(IXMLTextParsers, NumbersOfEachKind) {
     unsigned long long samples = 0;
-    ASSERT_TRUE(SamplesFromString(Z("1"), Z("5"), samples));
-    EXPECT_EQ(samples, (1ull << 32) + 5);
-    ASSERT_TRUE(SamplesFromString(Z("0"), Z("4294967295"), samples));
-    EXPECT_EQ(samples, 4294967295ull);
-    EXPECT_FALSE(SamplesFromString(Z(""), Z("5"), samples));
-    EXPECT_FALSE(SamplesFromString(Z("1"), Z(""), samples));
-    EXPECT_FALSE(SamplesFromString(Z("1"), Z("lots"), samples));
-}
-
-TEST_F(IXMLTextParsers, IntegersOfEachWidth) {
+    ASSERT_TRUE(SamplesFromString(Z("1"), Z("4294967295"), samples));
+    EXPECT_EQ(samples, (1ull << 32) + 4294967295ull);
+    for (const char* half : {"", "lots"}) {
+        EXPECT_FALSE(SamplesFromString(Z(half), Z("5"), samples)) << half;
+        EXPECT_FALSE(SamplesFromString(Z("1"), Z(half), samples)) << half;
+    }
     uint16_t small = 9;
     EXPECT_TRUE(IntegerFromZEBString(Z("65535"), small));
     EXPECT_EQ(small, 65535);
@@ -92,14 +88,9 @@ TEST_F(IXMLTextParsers, IntegersOfEachWidth) {
     EXPECT_TRUE(IntegerFromZEBString(Z("12 channels"), small));
     EXPECT_EQ(small, 12);
     uint32_t large = 0;
-    EXPECT_TRUE(IntegerFromZEBString(Z("48000"), large));
-    EXPECT_EQ(large, 48000u);
     EXPECT_FALSE(IntegerFromZEBString(Z("lots"), large));
-    EXPECT_TRUE(IntegerFromZEBString(Z(" 7"), large)) << "a failed read does not stop the next";
-    EXPECT_EQ(large, 7u);
-}
-
-TEST_F(IXMLTextParsers, VersionsAreDecimalNumbers) {
+    EXPECT_TRUE(IntegerFromZEBString(Z(" 4294967295"), large)) << "a failed read does not stop the next";
+    EXPECT_EQ(large, 4294967295u);
     double version = 0;
     EXPECT_TRUE(VersionFromString(Z("2.10"), version));
     EXPECT_DOUBLE_EQ(version, 2.1);
@@ -107,13 +98,7 @@ TEST_F(IXMLTextParsers, VersionsAreDecimalNumbers) {
     EXPECT_DOUBLE_EQ(version, 2.1);
 }
 
-TEST(IXMLTextHelpers, TruncateAndSplit) {
-    std::string text = std::string("<A>b</A>\0\0pad", 13);
-    TruncateIXMLString(text);
-    EXPECT_EQ(text, "<A>b</A>");
-    std::string none = "no markup";
-    TruncateIXMLString(none);
-    EXPECT_EQ(none, "no markup");
+TEST(SplitString, KeepsEmptyPieces) {
     EXPECT_EQ(HelperFunctions::SplitString("25/", '/'), (std::vector<std::string>{"25", ""}));
     EXPECT_EQ(HelperFunctions::SplitString("a", '/'), (std::vector<std::string>{"a"}));
     EXPECT_EQ(HelperFunctions::SplitString("/a//", '/'), (std::vector<std::string>{"", "a", "", ""}));
