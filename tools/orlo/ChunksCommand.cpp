@@ -9,9 +9,9 @@
 #include "OrloSession.h"
 #include "reader/BEXTChunk.h"
 #include "reader/ChunkIds.h"
-#include "reader/IXMLChunk.h"
 #include "reader/OrloStream.h"
 #include "reader/UMIDChunk.h"
+#include "reader/ixml/IXMLChunk.h"
 
 namespace {
 

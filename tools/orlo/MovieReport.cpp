@@ -4,7 +4,7 @@
 
 #include "JsonMaybe.h"
 #include "MobIDText.h"
-#include "reader/IXMLTextParsers.h"
+#include "reader/ixml/IXMLTextParsers.h"
 
 namespace {
 

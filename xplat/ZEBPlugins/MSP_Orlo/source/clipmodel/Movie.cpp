@@ -8,10 +8,10 @@
 #include "clipmodel/MobIDFromMetadata.h"
 #include "clipmodel/TextHelpers.h"
 #include "grouping/TrackIndexFromFileName.h"
-#include "reader/IXMLChunk.h"
 #include "reader/OrloStream.h"
-#include "reader/ParceRawIXML.h"
 #include "reader/UMIDChunk.h"
+#include "reader/ixml/IXMLChunk.h"
+#include "reader/ixml/ParceRawIXML.h"
 #include "tov/TOVResult.h"
 
 namespace OrloReader {

@@ -11,13 +11,13 @@
 #include "reader/DATAChunk.h"
 #include "reader/DS64Chunk.h"
 #include "reader/FMTChunk.h"
-#include "reader/IXMLChunk.h"
 #include "reader/PerformAdditionalInitialization.h"
 #include "reader/ReadBytes.h"
 #include "reader/ReadValue.h"
 #include "reader/SSNDChunk.h"
 #include "reader/StreamErrors.h"
 #include "reader/UMIDChunk.h"
+#include "reader/ixml/IXMLChunk.h"
 
 namespace Orlo {
 

@@ -1,11 +1,11 @@
-#include "reader/ParceRawIXML.h"
+#include "reader/ixml/ParceRawIXML.h"
 
 #include <optional>
 #include <string_view>
 #include <vector>
 
-#include "reader/IXMLElements.h"
-#include "reader/IXMLTextParsers.h"
+#include "reader/ixml/IXMLElements.h"
+#include "reader/ixml/IXMLTextParsers.h"
 #include "xml/ZEBXmlDoc.h"
 
 namespace Chunks {

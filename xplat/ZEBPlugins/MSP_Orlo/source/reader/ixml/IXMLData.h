@@ -4,8 +4,8 @@
 #include <cstdint>
 #include <vector>
 
-#include "reader/IXMLSpeed.h"
-#include "reader/IXMLTrack.h"
+#include "reader/ixml/IXMLSpeed.h"
+#include "reader/ixml/IXMLTrack.h"
 #include "strings/ZEBString.h"
 
 namespace Chunks {
