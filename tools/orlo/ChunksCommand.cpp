@@ -8,7 +8,6 @@
 #include "JsonText.h"
 #include "OrloSession.h"
 #include "reader/BEXTChunk.h"
-#include "reader/ChunkIds.h"
 #include "reader/OrloStream.h"
 #include "reader/UMIDChunk.h"
 #include "reader/ixml/IXMLChunk.h"
@@ -42,16 +41,8 @@ Json ValueOr(Get get) {
 }
 
 Json Chunks(const OrloStream& stream) {
-    static const struct {
-        unsigned int bit;
-        const char* id;
-    } kTable[] = {
-        {OrloStream::DS64_CHUNK, Chunks::DS64::ChunkId},     {OrloStream::FMT_CHUNK, Chunks::FMT::FMTChunkId},
-        {OrloStream::DATA_CHUNK, Chunks::DATA::DATAChunkId}, {OrloStream::BEXT_CHUNK, Chunks::BEXT::BEXTChunkId},
-        {OrloStream::IXML_CHUNK, Chunks::IXML::IXMLChunkId}, {OrloStream::UMID_CHUNK, Chunks::UMID::UMIDChunkId},
-        {OrloStream::COMM_CHUNK, Chunks::COMM::COMMChunkId}, {OrloStream::SSND_CHUNK, Chunks::SSND::SSNDChunkId}};
     Json ids = Json::array();
-    for (const auto& row : kTable)
+    for (const Orlo::ChunkTableRow& row : Orlo::kChunkTable)
         if (stream.HasChunk(row.bit)) ids.push_back(row.id);
     return ids;
 }
@@ -128,7 +119,7 @@ CLI::App* ChunksCommand::Declare(CLI::App& app) {
 int ChunksCommand::Run(const OrloOptions& options) {
     OrloSession session(options.Verbosity(), false);
     if (!session.Started()) return kExitFailed;
-    const OrloStream stream(m_Path.c_str(), 255);
+    const OrloStream stream(m_Path.c_str(), Orlo::kAllChunks);
     const Json report = Report(m_Path, stream, &session.Host());
     if (m_Json) {
         std::printf("%s\n", JsonDump(report, 2).c_str());

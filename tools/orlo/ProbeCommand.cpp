@@ -111,7 +111,7 @@ int ProbeCommand::Run(const OrloOptions& options) {
     if (result != TOV_OK) {
         // The plug-in gives only a code; the chunk stream's error, when it
         // has one, says what is wrong with the file.
-        const Orlo::OrloStream stream(m_Path.c_str(), 255);
+        const Orlo::OrloStream stream(m_Path.c_str(), Orlo::kAllChunks);
         const char* error = stream.GetError();
         report["reason"] = error ? Json(error) : Json(nullptr);
         std::fprintf(stderr, "orlo: %s: the plug-in made no clip of it (%s)%s%s\n", m_Path.c_str(),

@@ -34,7 +34,7 @@ std::shared_ptr<Track> Movie::GetTrack(unsigned int index) const {
 
 TOVRESULT Movie::ParseFromFile(ITOVComponentFactory* factory, const unsigned char* utf8Path,
                                std::unique_ptr<Orlo::OrloStream>& stream, Chunks::IXML::IXMLData* ixml) {
-    stream = std::make_unique<Orlo::OrloStream>(reinterpret_cast<const char*>(utf8Path), 255);
+    stream = std::make_unique<Orlo::OrloStream>(reinterpret_cast<const char*>(utf8Path), Orlo::kAllChunks);
     if (stream->GetError() != nullptr) return TOV_E_UNEXPECTED;
     if (ixml != nullptr && stream->HasChunk(Orlo::OrloStream::IXML_CHUNK)) {
         // A document that does not parse leaves `ixml` unparsed; the clip is
