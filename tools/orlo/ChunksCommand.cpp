@@ -7,6 +7,7 @@
 #include "IxmlReport.h"
 #include "JsonText.h"
 #include "OrloSession.h"
+#include "identity/IDText.h"
 #include "reader/BEXTChunk.h"
 #include "reader/OrloStream.h"
 #include "reader/UMIDChunk.h"
@@ -16,16 +17,6 @@ namespace {
 
 using Json = nlohmann::ordered_json;
 using Orlo::OrloStream;
-
-std::string Hex(const unsigned char* bytes, size_t count) {
-    static const char digits[] = "0123456789abcdef";
-    std::string out;
-    for (size_t i = 0; i < count; ++i) {
-        out += digits[bytes[i] >> 4];
-        out += digits[bytes[i] & 0x0F];
-    }
-    return out;
-}
 
 // The fixed-size text fields of bext are filled with zero bytes.
 std::string UpToZero(const std::string& text) { return text.substr(0, text.find('\0')); }
@@ -55,7 +46,7 @@ Json Bext(const Chunks::BEXT::BEXTChunk& bext) {
                 {"originationTime", UpToZero(bext.GetOriginationTime())},
                 {"timeReference", bext.GetTimeReference()},
                 {"version", bext.GetVersion()},
-                {"umid", Hex(bext.GetUMID(), 64)},
+                {"umid", ZEB::HexText(bext.GetUMID(), 64, ZEB::HexCase::Lower)},
                 {"keywords", Json(bext.GetConstParsedDescriptionField())},
                 {"codingHistory", UpToZero(bext.GetCodingHistory())}};
     if (bext.GetVersion() == 2) {
@@ -89,7 +80,7 @@ Json Report(const std::string& path, const OrloStream& stream, ITOVComponentFact
         out["ixml"] = IxmlReport(stream.GetChunk<Chunks::IXML::IXMLChunk>()->GetRawXml(), factory);
     if (stream.HasChunk(OrloStream::UMID_CHUNK)) {
         const auto umid = stream.GetChunk<Chunks::UMID::UMIDChunk>();
-        out["umid"] = {{"hex", Hex(umid->GetUMID(), 24)}, {"valid", umid->IsValid()}};
+        out["umid"] = {{"hex", ZEB::HexText(umid->GetUMID(), 24, ZEB::HexCase::Lower)}, {"valid", umid->IsValid()}};
     }
     return out;
 }
