@@ -4,24 +4,13 @@
 #include <cstdint>
 #include <vector>
 
+#include "reader/FlaggedField.h"
 #include "reader/ixml/IXMLSpeed.h"
 #include "reader/ixml/IXMLTrack.h"
 #include "strings/ZEBString.h"
 
 namespace Chunks {
 namespace IXML {
-
-// Get, Set, Has and SetHas of one value and its flag.
-#define IXML_DATA_FIELD(Type, Name)                         \
-public:                                                     \
-    const Type& Get##Name() const { return m_##Name; }      \
-    void Set##Name(const Type& value) { m_##Name = value; } \
-    bool Has##Name() const { return m_Has##Name; }          \
-    void SetHas##Name(bool has) { m_Has##Name = has; }      \
-                                                            \
-private:                                                    \
-    Type m_##Name{};                                        \
-    bool m_Has##Name = false;
 
 class IXMLData {
 public:
@@ -30,28 +19,34 @@ public:
     /// Set at the end of a whole parse; the clip model reads it as "has iXML".
     bool parsed = false;
 
-    IXML_DATA_FIELD(ZEB::ZEBString, Project)
-    IXML_DATA_FIELD(ZEB::ZEBString, Scene)
-    IXML_DATA_FIELD(ZEB::ZEBString, Take)
-    IXML_DATA_FIELD(ZEB::ZEBString, UBITS)
-    IXML_DATA_FIELD(ZEB::ZEBString, Tape)
-    IXML_DATA_FIELD(ZEB::ZEBString, Notes)
-    IXML_DATA_FIELD(ZEB::ZEBString, User)
-    IXML_DATA_FIELD(ZEB::ZEBString, FileUID)
-    IXML_DATA_FIELD(uint16_t, TracksCount)
-    IXML_DATA_FIELD(std::vector<IXMLTrack>, TracksList)
-    IXML_DATA_FIELD(IXMLSpeed, Speed)
-    IXML_DATA_FIELD(bool, Circled)
-    IXML_DATA_FIELD(bool, NoGood)
-    IXML_DATA_FIELD(bool, FalseStart)
-    IXML_DATA_FIELD(bool, WildTrack)
-    IXML_DATA_FIELD(double, Version)
+    ORLO_FLAGGED_FIELD(, ZEB::ZEBString, Project)
+    ORLO_FLAGGED_FIELD(, ZEB::ZEBString, Scene)
+    ORLO_FLAGGED_FIELD(, ZEB::ZEBString, Take)
+    ORLO_FLAGGED_FIELD(, ZEB::ZEBString, UBITS)
+    ORLO_FLAGGED_FIELD(, ZEB::ZEBString, Tape)
+    ORLO_FLAGGED_FIELD(, ZEB::ZEBString, Notes)
+    ORLO_FLAGGED_FIELD(, ZEB::ZEBString, User)
+    ORLO_FLAGGED_FIELD(, ZEB::ZEBString, FileUID)
+    ORLO_FLAGGED_FIELD(, uint16_t, TracksCount)
+    ORLO_FLAGGED_FIELD(, std::vector<IXMLTrack>, TracksList)
+    ORLO_FLAGGED_FIELD(, IXMLSpeed, Speed)
+    ORLO_FLAGGED_FIELD(, bool, Circled)
+    ORLO_FLAGGED_FIELD(, bool, NoGood)
+    ORLO_FLAGGED_FIELD(, bool, FalseStart)
+    ORLO_FLAGGED_FIELD(, bool, WildTrack)
+    ORLO_FLAGGED_FIELD(, double, Version)
 
 public:
     void AddTrackToTrackList(const IXMLTrack& track) { m_TracksList.push_back(track); }
-};
 
-#undef IXML_DATA_FIELD
+private:
+    struct HasFlags {
+        bool Project = false, Scene = false, Take = false, UBITS = false, Tape = false, Notes = false, User = false,
+             FileUID = false, TracksCount = false, TracksList = false, Speed = false, Circled = false, NoGood = false,
+             FalseStart = false, WildTrack = false, Version = false;
+    };
+    HasFlags m_Has;
+};
 
 }  // namespace IXML
 }  // namespace Chunks
