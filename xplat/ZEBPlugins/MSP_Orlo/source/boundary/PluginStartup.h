@@ -1,9 +1,9 @@
 #pragma once
 /// The module's own start-up sequence: the host's factory kept, `g_pConsole`
 /// set to the host's console, the toggles registered; undone in reverse order
-/// when the object goes. The module's entry points run it, and so does
-/// whatever starts the plug-in in process. One at a time: the plug-in's
-/// globals are the process's.
+/// when the object goes. It is what the module's entry points are to run, and
+/// what starts the plug-in in process meanwhile. One at a time: the
+/// plug-in's globals are the process's.
 #include "tov/ITOVUnknown.h"
 #include "tov/TOVResult.h"
 
