@@ -13,6 +13,7 @@
 #include "reader/ixml/IXMLChunk.h"
 #include "reader/ixml/ParceRawIXML.h"
 #include "tov/TOVResult.h"
+#include "tov/sdk/TOVFailureStyle.h"
 
 namespace OrloReader {
 
@@ -45,7 +46,7 @@ TOVRESULT Movie::ParseFromFile(ITOVComponentFactory* factory, const unsigned cha
 }
 
 TOVRESULT Movie::InitFromFile(const ZEB::ZEBString& path, ITOVComponentFactory* factory, bool allowGrouping) {
-    try {
+    return TOVGuarded([&] {
         Chunks::IXML::IXMLData ixml;
         m_FilePath = path;
         ZEB::ZEBString utf8Path(path);
@@ -55,11 +56,7 @@ TOVRESULT Movie::InitFromFile(const ZEB::ZEBString& path, ITOVComponentFactory* 
         if (parsed < 0) throw static_cast<int>(parsed);
         FillFromStream(*stream, ixml, factory, allowGrouping);
         return TOV_OK;
-    } catch (int result) {
-        return result;
-    } catch (...) {
-        return TOV_E_UNEXPECTED;
-    }
+    });
 }
 
 void Movie::FillFromStream(const Orlo::OrloStream& stream, const Chunks::IXML::IXMLData& ixml,
