@@ -47,7 +47,7 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
 
     const int free = LowestFreeDescriptor();
     {
-        const Orlo::OrloStream stream(g_input->Path().c_str(), 255);
+        const Orlo::OrloStream stream(g_input->Path().c_str(), Orlo::kAllChunks);
         Ask([&] { return stream.GetChannelCount(); });
         Ask([&] { return stream.GetBitsPerSample(); });
         Ask([&] { return stream.GetIsDataFloatingPoint(); });

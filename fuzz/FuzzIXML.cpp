@@ -4,8 +4,8 @@
 #include <string>
 
 #include "FuzzHost.h"
-#include "reader/IXMLTextParsers.h"
-#include "reader/ParceRawIXML.h"
+#include "reader/ixml/IXMLTextParsers.h"
+#include "reader/ixml/ParceRawIXML.h"
 
 namespace {
 ITOVComponentFactory* g_factory = nullptr;

@@ -8,9 +8,9 @@
 
 #include "FuzzHost.h"
 #include "FuzzInputFile.h"
-#include "PluginStartup.h"
 #include "boundary/DynamicToggles.h"
 #include "boundary/OrloConstants.h"
+#include "boundary/PluginStartup.h"
 #include "clipmodel/Movie.h"
 
 namespace {
@@ -28,7 +28,7 @@ extern "C" int LLVMFuzzerInitialize(int*, char***) {
     TOVHost* host = StartFuzzHost();
     g_factory.Assign(host);
     // The plug-in's globals, as its start-up sets them, for the whole run.
-    static PluginStartup startup(*host);
+    static PluginStartup startup(host->AsUnknown());
     if (startup.Result() != TOV_OK) std::abort();
     g_input = new FuzzInputFile("orlo-fuzz-movie");
     return 0;

@@ -12,9 +12,9 @@
 #include "AudioFileWriter.h"
 #include "ChunkPayloads.h"
 #include "ExampleTake.h"
-#include "PluginStartup.h"
 #include "TempFile.h"
 #include "boundary/NewMovieFromFilePath.h"
+#include "boundary/PluginStartup.h"
 #include "startup/ZEBUtilLib.h"
 #include "tov/host/TOVHost.h"
 
@@ -84,7 +84,7 @@ int main(int argc, char** argv) {
     if (ZEB::ZEBInitialize(host.Get()) < 0) return 1;
     int status = 0;
     {
-        PluginStartup plugin(*host);
+        PluginStartup plugin(host->AsUnknown());
         Files files;
         g_files = &files;
         g_host = host.Get();

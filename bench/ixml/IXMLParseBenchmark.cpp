@@ -6,7 +6,7 @@
 #include <string>
 
 #include "TestHost.h"
-#include "reader/ParceRawIXML.h"
+#include "reader/ixml/ParceRawIXML.h"
 #include "startup/ZEBUtilLib.h"
 #include "xml/ZEBXmlDoc.h"
 

@@ -97,7 +97,7 @@ Files* g_files = nullptr;
 
 void Open(benchmark::State& state, const TempFile& file) {
     for (auto _ : state) {
-        Orlo::OrloStream stream(file.Path().c_str(), 255);
+        Orlo::OrloStream stream(file.Path().c_str(), Orlo::kAllChunks);
         if (stream.GetError()) state.SkipWithError(stream.GetError());
         benchmark::DoNotOptimize(stream.GetSampleCount());
     }

@@ -45,7 +45,7 @@ void ClipFixture::SetUp() {
     ASSERT_NE(mkdtemp(pattern), nullptr);
     folder = pattern;
     ASSERT_EQ(ZEB::ZEBInitialize(host.Get()), TOV_OK);
-    startup = std::make_unique<PluginStartup>(*host);
+    startup = std::make_unique<PluginStartup>(host->AsUnknown());
     ASSERT_EQ(startup->Result(), TOV_OK);
     host.ClearLines();
 }

@@ -9,8 +9,8 @@
 #include <string>
 
 #include "ChunkPayloads.h"
-#include "PluginStartup.h"
 #include "TestHost.h"
+#include "boundary/PluginStartup.h"
 #include "clipmodel/Movie.h"
 
 /// What one test file holds; empty texts leave their chunk out.

@@ -4,10 +4,10 @@
 
 #include <cstring>
 
-#include "MobIDText.h"
 #include "ToggleSetting.h"
 #include "boundary/OrloConstants.h"
 #include "identity/GetMobIDFromString.h"
+#include "identity/IDText.h"
 
 namespace {
 
@@ -73,7 +73,7 @@ TEST(MobIDText, ReadsBackIntoTheSameBytes) {
         Filled([](int i) -> unsigned char { return static_cast<unsigned char>(i < 16 ? 0 : i); }),
     };
     for (const _aafMobID_t& id : ids) {
-        const std::string text = MobIDText(id);
+        const std::string text = ZEB::MobIDDigits(id, ZEB::HexCase::Upper);
         ASSERT_EQ(text.size(), 64u);
         EXPECT_EQ(text.find_first_not_of("0123456789ABCDEF"), std::string::npos) << text;
         _aafMobID_t back;

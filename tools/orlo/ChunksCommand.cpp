@@ -7,26 +7,16 @@
 #include "IxmlReport.h"
 #include "JsonText.h"
 #include "OrloSession.h"
+#include "identity/IDText.h"
 #include "reader/BEXTChunk.h"
-#include "reader/ChunkIds.h"
-#include "reader/IXMLChunk.h"
 #include "reader/OrloStream.h"
 #include "reader/UMIDChunk.h"
+#include "reader/ixml/IXMLChunk.h"
 
 namespace {
 
 using Json = nlohmann::ordered_json;
 using Orlo::OrloStream;
-
-std::string Hex(const unsigned char* bytes, size_t count) {
-    static const char digits[] = "0123456789abcdef";
-    std::string out;
-    for (size_t i = 0; i < count; ++i) {
-        out += digits[bytes[i] >> 4];
-        out += digits[bytes[i] & 0x0F];
-    }
-    return out;
-}
 
 // The fixed-size text fields of bext are filled with zero bytes.
 std::string UpToZero(const std::string& text) { return text.substr(0, text.find('\0')); }
@@ -42,16 +32,8 @@ Json ValueOr(Get get) {
 }
 
 Json Chunks(const OrloStream& stream) {
-    static const struct {
-        unsigned int bit;
-        const char* id;
-    } kTable[] = {
-        {OrloStream::DS64_CHUNK, Chunks::DS64::ChunkId},     {OrloStream::FMT_CHUNK, Chunks::FMT::FMTChunkId},
-        {OrloStream::DATA_CHUNK, Chunks::DATA::DATAChunkId}, {OrloStream::BEXT_CHUNK, Chunks::BEXT::BEXTChunkId},
-        {OrloStream::IXML_CHUNK, Chunks::IXML::IXMLChunkId}, {OrloStream::UMID_CHUNK, Chunks::UMID::UMIDChunkId},
-        {OrloStream::COMM_CHUNK, Chunks::COMM::COMMChunkId}, {OrloStream::SSND_CHUNK, Chunks::SSND::SSNDChunkId}};
     Json ids = Json::array();
-    for (const auto& row : kTable)
+    for (const Orlo::ChunkTableRow& row : Orlo::kChunkTable)
         if (stream.HasChunk(row.bit)) ids.push_back(row.id);
     return ids;
 }
@@ -64,7 +46,7 @@ Json Bext(const Chunks::BEXT::BEXTChunk& bext) {
                 {"originationTime", UpToZero(bext.GetOriginationTime())},
                 {"timeReference", bext.GetTimeReference()},
                 {"version", bext.GetVersion()},
-                {"umid", Hex(bext.GetUMID(), 64)},
+                {"umid", ZEB::HexText(bext.GetUMID(), 64, ZEB::HexCase::Lower)},
                 {"keywords", Json(bext.GetConstParsedDescriptionField())},
                 {"codingHistory", UpToZero(bext.GetCodingHistory())}};
     if (bext.GetVersion() == 2) {
@@ -98,7 +80,7 @@ Json Report(const std::string& path, const OrloStream& stream, ITOVComponentFact
         out["ixml"] = IxmlReport(stream.GetChunk<Chunks::IXML::IXMLChunk>()->GetRawXml(), factory);
     if (stream.HasChunk(OrloStream::UMID_CHUNK)) {
         const auto umid = stream.GetChunk<Chunks::UMID::UMIDChunk>();
-        out["umid"] = {{"hex", Hex(umid->GetUMID(), 24)}, {"valid", umid->IsValid()}};
+        out["umid"] = {{"hex", ZEB::HexText(umid->GetUMID(), 24, ZEB::HexCase::Lower)}, {"valid", umid->IsValid()}};
     }
     return out;
 }
@@ -128,7 +110,7 @@ CLI::App* ChunksCommand::Declare(CLI::App& app) {
 int ChunksCommand::Run(const OrloOptions& options) {
     OrloSession session(options.Verbosity(), false);
     if (!session.Started()) return kExitFailed;
-    const OrloStream stream(m_Path.c_str(), 255);
+    const OrloStream stream(m_Path.c_str(), Orlo::kAllChunks);
     const Json report = Report(m_Path, stream, &session.Host());
     if (m_Json) {
         std::printf("%s\n", JsonDump(report, 2).c_str());

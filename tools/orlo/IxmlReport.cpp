@@ -2,8 +2,8 @@
 
 #include "JsonMaybe.h"
 #include "ResultText.h"
-#include "reader/IXMLTextParsers.h"
-#include "reader/ParceRawIXML.h"
+#include "reader/ixml/IXMLTextParsers.h"
+#include "reader/ixml/ParceRawIXML.h"
 
 namespace {
 

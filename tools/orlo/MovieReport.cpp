@@ -3,8 +3,8 @@
 #include <string>
 
 #include "JsonMaybe.h"
-#include "MobIDText.h"
-#include "reader/IXMLTextParsers.h"
+#include "identity/IDText.h"
+#include "reader/ixml/IXMLTextParsers.h"
 
 namespace {
 
@@ -87,7 +87,7 @@ Json MovieReport(const Movie& movie) {
             {"fileTimeCode", movie.HasMovieFileTimeCode() ? TimeCode(movie.GetMovieFileTimeCode()) : Json(nullptr)},
             {"startOffset", JsonMaybe(movie.HasMovieStartOffset(), movie.GetMovieStartOffset())},
             {"groupLength", JsonMaybe(movie.HasMovieGroupLength(), movie.GetMovieGroupLength())},
-            {"mobID", MobIDText(movie.GetMobID())},
+            {"mobID", ZEB::MobIDDigits(movie.GetMobID(), ZEB::HexCase::Upper)},
             {"startingTrackIndex", movie.GetStartingTrackIndex()},
             {"monoAudio", movie.IsMonoAudio()},
             {"monophonicGroup", movie.IsMonophonicGroup()},

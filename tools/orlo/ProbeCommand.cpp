@@ -7,13 +7,13 @@
 #include "JsonText.h"
 #include "MovieReport.h"
 #include "OrloSession.h"
-#include "PluginStartup.h"
 #include "ProbeText.h"
 #include "ResultText.h"
 #include "ToggleSetting.h"
 #include "boundary/AudioImportSettings.h"
 #include "boundary/DynamicToggles.h"
 #include "boundary/NewMovieFromFilePath.h"
+#include "boundary/PluginStartup.h"
 #include "reader/OrloStream.h"
 #include "tov/IHostSettings.h"
 #include "tov/sdk/TOVFailureStyle.h"
@@ -97,7 +97,7 @@ int ProbeCommand::Run(const OrloOptions& options) {
     Json report = {{"file", m_Path}, {"result", nullptr}};
     TOVRESULT result = TOV_OK;
     {
-        PluginStartup plugin(host);
+        PluginStartup plugin(host.AsUnknown());
         if (Refused(plugin.Result(), "the plug-in did not start") < 0) return kExitFailed;
         if (ApplyChoices(host, m_ToggleTexts, m_NoAutodetectGroups) < 0) return kExitFailed;
         report["groupingAllowed"] = GroupingAllowed(host);
@@ -111,7 +111,7 @@ int ProbeCommand::Run(const OrloOptions& options) {
     if (result != TOV_OK) {
         // The plug-in gives only a code; the chunk stream's error, when it
         // has one, says what is wrong with the file.
-        const Orlo::OrloStream stream(m_Path.c_str(), 255);
+        const Orlo::OrloStream stream(m_Path.c_str(), Orlo::kAllChunks);
         const char* error = stream.GetError();
         report["reason"] = error ? Json(error) : Json(nullptr);
         std::fprintf(stderr, "orlo: %s: the plug-in made no clip of it (%s)%s%s\n", m_Path.c_str(),

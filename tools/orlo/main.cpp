@@ -8,13 +8,6 @@
 #include "OrloVersion.h"
 #include "ProbeCommand.h"
 #include "VersionCommand.h"
-#include "tov/ITOVConsole.h"
-#include "tov/host/HostConsole.h"
-
-uint32_t OrloOptions::Verbosity() const {
-    if (quiet) return kTOVDebugLevelError;
-    return verbose ? HostConsole::kDefaultVerbosity | kTOVDebugLevelTrace : HostConsole::kDefaultVerbosity;
-}
 
 int main(int argc, char** argv) {
     CLI::App app{"orlo: see what the plug-in makes of audio files before they reach the edit"};

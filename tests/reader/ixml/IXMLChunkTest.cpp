@@ -4,7 +4,7 @@
 #include "AudioFileWriter.h"
 #include "ChunkPayloads.h"
 #include "ReaderTest.h"
-#include "reader/IXMLChunk.h"
+#include "reader/ixml/IXMLChunk.h"
 
 namespace {
 

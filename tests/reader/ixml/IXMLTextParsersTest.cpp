@@ -2,8 +2,8 @@
 #include <gtest/gtest.h>
 
 #include "ReaderTest.h"
-#include "reader/IXMLTextParsers.h"
 #include "reader/SplitString.h"
+#include "reader/ixml/IXMLTextParsers.h"
 
 namespace {
 

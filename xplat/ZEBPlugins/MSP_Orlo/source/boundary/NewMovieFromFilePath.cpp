@@ -5,13 +5,14 @@
 #include "boundary/AudioImportSettings.h"
 #include "tov/IHostSettings.h"
 #include "tov/TOVResult.h"
+#include "tov/sdk/TOVFailureStyle.h"
 #include "tov/sdk/TOVPtr.h"
 
 namespace ZEB {
 namespace Impl {
 
 TOVRESULT NewMovieFromFilePath(const ZEBString& path, OrloReader::Movie** out, ITOVComponentFactory* factory) {
-    try {
+    return TOVGuarded([&] {
         bool allowGrouping = true;
         TOVPtr<IHostSettings> settings;
         GetAudioImportSettings(factory, settings, allowGrouping);
@@ -25,11 +26,7 @@ TOVRESULT NewMovieFromFilePath(const ZEBString& path, OrloReader::Movie** out, I
         }
         *out = movie.release();
         return TOV_OK;
-    } catch (int result) {
-        return result;
-    } catch (...) {
-        return TOV_E_UNEXPECTED;
-    }
+    });
 }
 
 }  // namespace Impl

@@ -4,8 +4,8 @@
 #include "aaf/AAFTypes.h"
 #include "clipmodel/Movie.h"
 #include "reader/BEXTChunk.h"
-#include "reader/IXMLData.h"
-#include "reader/IXMLSpeed.h"
+#include "reader/ixml/IXMLData.h"
+#include "reader/ixml/IXMLSpeed.h"
 #include "strings/ZEBString.h"
 #include "tov/ITOVComponentFactory.h"
 

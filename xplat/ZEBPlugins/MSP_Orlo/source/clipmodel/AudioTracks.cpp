@@ -6,7 +6,7 @@
 #include "clipmodel/TextHelpers.h"
 #include "grouping/ConvertAlphaIndexToNumber.h"
 #include "reader/ByteSwap.h"
-#include "reader/IXMLTextParsers.h"
+#include "reader/ixml/IXMLTextParsers.h"
 
 namespace OrloReader {
 

@@ -7,8 +7,8 @@
 #include "aaf/AAFTypes.h"
 #include "clipmodel/Movie.h"
 #include "reader/BEXTChunk.h"
-#include "reader/IXMLData.h"
-#include "reader/IXMLTrack.h"
+#include "reader/ixml/IXMLData.h"
+#include "reader/ixml/IXMLTrack.h"
 #include "tov/ITOVComponentFactory.h"
 
 namespace OrloReader {

@@ -5,7 +5,7 @@
 #include "clipmodel/FindBextKeyword.h"
 #include "clipmodel/GetFileCreationTime.h"
 #include "clipmodel/TextHelpers.h"
-#include "reader/IXMLTextParsers.h"
+#include "reader/ixml/IXMLTextParsers.h"
 
 namespace OrloReader {
 

@@ -6,7 +6,7 @@
 
 #include "clipmodel/Movie.h"
 #include "reader/BEXTChunk.h"
-#include "reader/IXMLData.h"
+#include "reader/ixml/IXMLData.h"
 #include "strings/ZEBString.h"
 
 namespace OrloReader {

@@ -12,7 +12,7 @@
 #include "clipmodel/TextHelpers.h"
 #include "identity/GenerateUMIDFromData.h"
 #include "identity/GetMobIDFromString.h"
-#include "reader/IXMLTextParsers.h"
+#include "reader/ixml/IXMLTextParsers.h"
 #include "tov/TOVResult.h"
 
 namespace OrloReader {

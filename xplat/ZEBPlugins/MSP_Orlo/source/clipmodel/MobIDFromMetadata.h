@@ -6,8 +6,8 @@
 
 #include "aaf/AAFTypes.h"
 #include "reader/BEXTChunk.h"
-#include "reader/IXMLData.h"
 #include "reader/UMIDChunk.h"
+#include "reader/ixml/IXMLData.h"
 #include "strings/ZEBString.h"
 
 namespace OrloReader {

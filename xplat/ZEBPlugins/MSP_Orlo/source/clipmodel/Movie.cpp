@@ -8,11 +8,12 @@
 #include "clipmodel/MobIDFromMetadata.h"
 #include "clipmodel/TextHelpers.h"
 #include "grouping/TrackIndexFromFileName.h"
-#include "reader/IXMLChunk.h"
 #include "reader/OrloStream.h"
-#include "reader/ParceRawIXML.h"
 #include "reader/UMIDChunk.h"
+#include "reader/ixml/IXMLChunk.h"
+#include "reader/ixml/ParceRawIXML.h"
 #include "tov/TOVResult.h"
+#include "tov/sdk/TOVFailureStyle.h"
 
 namespace OrloReader {
 
@@ -34,7 +35,7 @@ std::shared_ptr<Track> Movie::GetTrack(unsigned int index) const {
 
 TOVRESULT Movie::ParseFromFile(ITOVComponentFactory* factory, const unsigned char* utf8Path,
                                std::unique_ptr<Orlo::OrloStream>& stream, Chunks::IXML::IXMLData* ixml) {
-    stream = std::make_unique<Orlo::OrloStream>(reinterpret_cast<const char*>(utf8Path), 255);
+    stream = std::make_unique<Orlo::OrloStream>(reinterpret_cast<const char*>(utf8Path), Orlo::kAllChunks);
     if (stream->GetError() != nullptr) return TOV_E_UNEXPECTED;
     if (ixml != nullptr && stream->HasChunk(Orlo::OrloStream::IXML_CHUNK)) {
         // A document that does not parse leaves `ixml` unparsed; the clip is
@@ -45,7 +46,7 @@ TOVRESULT Movie::ParseFromFile(ITOVComponentFactory* factory, const unsigned cha
 }
 
 TOVRESULT Movie::InitFromFile(const ZEB::ZEBString& path, ITOVComponentFactory* factory, bool allowGrouping) {
-    try {
+    return TOVGuarded([&] {
         Chunks::IXML::IXMLData ixml;
         m_FilePath = path;
         ZEB::ZEBString utf8Path(path);
@@ -55,11 +56,7 @@ TOVRESULT Movie::InitFromFile(const ZEB::ZEBString& path, ITOVComponentFactory* 
         if (parsed < 0) throw static_cast<int>(parsed);
         FillFromStream(*stream, ixml, factory, allowGrouping);
         return TOV_OK;
-    } catch (int result) {
-        return result;
-    } catch (...) {
-        return TOV_E_UNEXPECTED;
-    }
+    });
 }
 
 void Movie::FillFromStream(const Orlo::OrloStream& stream, const Chunks::IXML::IXMLData& ixml,

@@ -12,6 +12,7 @@
 #include "clipmodel/TimeCodeInfo.h"
 #include "clipmodel/Track.h"
 #include "grouping/TrkComparsion.h"
+#include "reader/FlaggedField.h"
 #include "strings/ZEBString.h"
 #include "tov/ITOVComponentFactory.h"
 
@@ -25,18 +26,6 @@ class OrloStream;
 }
 
 namespace OrloReader {
-
-// A value, its has flag, and their four accessors in the pattern
-// GetMovieScene / SetMovieScene / HasMovieScene / SetHasMovieScene.
-#define ORLO_MOVIE_FIELD(Type, Name)                             \
-public:                                                          \
-    const Type& GetMovie##Name() const { return m_##Name; }      \
-    void SetMovie##Name(const Type& value) { m_##Name = value; } \
-    bool HasMovie##Name() const { return m_Has.Name; }           \
-    void SetHasMovie##Name(bool has) { m_Has.Name = has; }       \
-                                                                 \
-private:                                                         \
-    Type m_##Name{};
 
 class Movie {
 public:
@@ -58,25 +47,25 @@ public:
     int32_t GetStartingTrackIndex() const { return m_StartingTrackIndex; }
     void SetStartingTrackIndex(int32_t index) { m_StartingTrackIndex = index; }
 
-    ORLO_MOVIE_FIELD(std::string, Notes)
-    ORLO_MOVIE_FIELD(std::string, UBITS)
-    ORLO_MOVIE_FIELD(std::string, Tape)
-    ORLO_MOVIE_FIELD(std::string, ShootDate)
-    ORLO_MOVIE_FIELD(std::string, Scene)
-    ORLO_MOVIE_FIELD(std::string, Take)
-    ORLO_MOVIE_FIELD(std::string, UserComments)
-    ORLO_MOVIE_FIELD(std::string, Project)
-    ORLO_MOVIE_FIELD(bool, Circled)
-    ORLO_MOVIE_FIELD(bool, WildTrack)
-    ORLO_MOVIE_FIELD(bool, FalseStart)
-    ORLO_MOVIE_FIELD(bool, NoGood)
-    ORLO_MOVIE_FIELD(uint32_t, DigitizerRate)
-    ORLO_MOVIE_FIELD(int64_t, StartOffset)
-    ORLO_MOVIE_FIELD(int64_t, GroupLength)
-    ORLO_MOVIE_FIELD(HelperFunctions::TrkMap, TRKs)
-    ORLO_MOVIE_FIELD(_aafRational_t, EditRate)
-    ORLO_MOVIE_FIELD(TimeCodeInfo, TimeCode)
-    ORLO_MOVIE_FIELD(TimeCodeInfo, FileTimeCode)
+    ORLO_FLAGGED_FIELD(Movie, std::string, Notes)
+    ORLO_FLAGGED_FIELD(Movie, std::string, UBITS)
+    ORLO_FLAGGED_FIELD(Movie, std::string, Tape)
+    ORLO_FLAGGED_FIELD(Movie, std::string, ShootDate)
+    ORLO_FLAGGED_FIELD(Movie, std::string, Scene)
+    ORLO_FLAGGED_FIELD(Movie, std::string, Take)
+    ORLO_FLAGGED_FIELD(Movie, std::string, UserComments)
+    ORLO_FLAGGED_FIELD(Movie, std::string, Project)
+    ORLO_FLAGGED_FIELD(Movie, bool, Circled)
+    ORLO_FLAGGED_FIELD(Movie, bool, WildTrack)
+    ORLO_FLAGGED_FIELD(Movie, bool, FalseStart)
+    ORLO_FLAGGED_FIELD(Movie, bool, NoGood)
+    ORLO_FLAGGED_FIELD(Movie, uint32_t, DigitizerRate)
+    ORLO_FLAGGED_FIELD(Movie, int64_t, StartOffset)
+    ORLO_FLAGGED_FIELD(Movie, int64_t, GroupLength)
+    ORLO_FLAGGED_FIELD(Movie, HelperFunctions::TrkMap, TRKs)
+    ORLO_FLAGGED_FIELD(Movie, _aafRational_t, EditRate)
+    ORLO_FLAGGED_FIELD(Movie, TimeCodeInfo, TimeCode)
+    ORLO_FLAGGED_FIELD(Movie, TimeCodeInfo, FileTimeCode)
 
 public:
     const std::string& GetMovieTapeName() const { return m_Tape; }
@@ -142,7 +131,5 @@ private:
     ZEB::ZEBString m_FilePath;
     std::string m_MovieName;
 };
-
-#undef ORLO_MOVIE_FIELD
 
 }  // namespace OrloReader

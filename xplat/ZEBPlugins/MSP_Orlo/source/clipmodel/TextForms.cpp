@@ -1,15 +1,17 @@
 #include "clipmodel/TextForms.h"
 
+#include <algorithm>
 #include <cstdio>
 #include <cstring>
 
 #include "clipmodel/TruncateToInteger.h"
+#include "identity/IDText.h"
 
 namespace OrloReader {
 
 namespace {
 
-/// The longest of the forms below, the Mob ID's 52 characters, with room.
+/// Room for the longest form written here, the time stamp.
 constexpr size_t kTextSize = 96;
 
 }  // namespace
@@ -27,22 +29,14 @@ std::string ToString(const _aafRational_t& rate) {
 }
 
 std::string ToString(const _aafMobID_t& id) {
-    char text[kTextSize];
-    int at = 0;
-    for (int i = 0; i < 6; ++i) at += std::snprintf(text + at, sizeof text - at, "%02X", id.SMPTELabel[i]);
-    const aafUID_t& m = id.material;
-    std::snprintf(text + at, sizeof text - at, "%02X%02X%02X%02X%08X%04X%04X%02X%02X%02X%02X%02X%02X%02X%02X",
-                  id.length, id.instanceHigh, id.instanceMid, id.instanceLow, m.Data1, m.Data2, m.Data3, m.Data4[0],
-                  m.Data4[1], m.Data4[2], m.Data4[3], m.Data4[4], m.Data4[5], m.Data4[6], m.Data4[7]);
-    return text;
+    // Label bytes 6 to 11 are the 12 digits from 12 on.
+    return ZEB::MobIDDigits(id, ZEB::HexCase::Upper).erase(12, 12);
 }
 
 std::string ToString(const _tovUID& uid) {
-    char text[kTextSize];
-    std::snprintf(text, sizeof text, "urn:uuid:%08x-%04x-%04x-%02x%02x-%02x%02x%02x%02x%02x%02x", uid.Data1, uid.Data2,
-                  uid.Data3, uid.Data4[0], uid.Data4[1], uid.Data4[2], uid.Data4[3], uid.Data4[4], uid.Data4[5],
-                  uid.Data4[6], uid.Data4[7]);
-    return text;
+    _aafUID_t id{uid.Data1, uid.Data2, uid.Data3, {}};
+    std::copy(std::begin(uid.Data4), std::end(uid.Data4), id.Data4);
+    return "urn:uuid:" + ZEB::GUIDText(id, ZEB::HexCase::Lower);
 }
 
 std::string ToString(const TimeCodeInfo& timecode) {

@@ -1,5 +1,7 @@
 #include "clipmodel/TextHelpers.h"
 
+#include "identity/IDText.h"
+
 namespace HelperFunctions {
 
 namespace {
@@ -10,15 +12,7 @@ bool IsDigit(char c) { return c >= '0' && c <= '9'; }
 
 std::string HexDumpFromMemory(const char* data, unsigned long length) {
     if (!data || length % 2 != 0) return std::string();
-    static const char digits[] = "0123456789abcdef";
-    std::string hex;
-    hex.reserve(length * 2);
-    for (unsigned long i = 0; i < length; ++i) {
-        const unsigned char byte = static_cast<unsigned char>(data[i]);
-        hex += digits[byte >> 4];
-        hex += digits[byte & 0x0F];
-    }
-    return hex;
+    return ZEB::HexText(reinterpret_cast<const unsigned char*>(data), length, ZEB::HexCase::Lower);
 }
 
 std::string TrimFromBeginningAndEnd(const std::string& text, char c) {

@@ -6,7 +6,6 @@
 #include <string>
 
 #include "reader/Chunk.h"
-#include "reader/ChunkIds.h"
 
 namespace Chunks {
 namespace BEXT {
@@ -22,6 +21,9 @@ struct BEXTLoudness {
 
 class BEXTChunk : public Chunk {
 public:
+    /// This parser's bit in the stream's chunk masks.
+    static constexpr unsigned int kMaskBit = 1u << 3;
+
     /// Refuses a chunk under 602 bytes, the fixed part.
     bool InitChunkFromStream(const ChunkHeader_t& header, FILE* file, bool wrongEndian) override;
 

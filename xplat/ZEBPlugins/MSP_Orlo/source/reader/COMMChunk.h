@@ -5,7 +5,6 @@
 #include <string>
 
 #include "reader/Chunk.h"
-#include "reader/ChunkIds.h"
 
 namespace Chunks {
 namespace COMM {
@@ -15,6 +14,9 @@ inline constexpr char kSowt[] = "sowt";
 
 class COMMChunk : public Chunk {
 public:
+    /// This parser's bit in the stream's chunk masks.
+    static constexpr unsigned int kMaskBit = 1u << 6;
+
     /// Accepts a chunk of at least 18 bytes. Throws a text for "fl64" and for
     /// a compression type it does not know.
     bool InitChunkFromStream(const ChunkHeader_t& header, FILE* file, bool wrongEndian) override;

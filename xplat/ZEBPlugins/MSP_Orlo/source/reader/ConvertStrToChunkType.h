@@ -4,7 +4,7 @@
 
 namespace Orlo {
 
-/// The `OrloStream::SupportedChunks` value of `id`, or 0 for an unknown chunk.
+/// The bit of the kChunkTable row for `id`, or 0 for an unknown chunk.
 /// Whole, case-sensitive matches only: "FMT " or "ixml" are unknown.
 unsigned int ConvertStrToChunkType(const std::string& id);
 

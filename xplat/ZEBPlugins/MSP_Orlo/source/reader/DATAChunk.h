@@ -4,7 +4,6 @@
 #include <cstdint>
 
 #include "reader/Chunk.h"
-#include "reader/ChunkIds.h"
 
 namespace Orlo {
 class OrloStream;
@@ -15,6 +14,9 @@ namespace DATA {
 
 class DATAChunk : public Chunk {
 public:
+    /// This parser's bit in the stream's chunk masks.
+    static constexpr unsigned int kMaskBit = 1u << 2;
+
     /// `stream` is not owned; it owns this parser and outlives it.
     explicit DATAChunk(Orlo::OrloStream* stream) : m_Stream(stream) {}
 

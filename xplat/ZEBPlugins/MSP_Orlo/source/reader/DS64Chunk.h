@@ -3,13 +3,15 @@
 #include <cstdint>
 
 #include "reader/Chunk.h"
-#include "reader/ChunkIds.h"
 
 namespace Chunks {
 namespace DS64 {
 
 class DS64Chunk : public Chunk {
 public:
+    /// This parser's bit in the stream's chunk masks.
+    static constexpr unsigned int kMaskBit = 1u << 0;
+
     /// Refuses a chunk whose data size and sample count are both 0. A chunk
     /// cut off by the end of the file is logged and refused.
     bool InitChunkFromStream(const ChunkHeader_t& header, FILE* file, bool wrongEndian) override;

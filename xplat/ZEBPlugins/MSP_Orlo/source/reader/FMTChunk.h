@@ -3,13 +3,15 @@
 #include <cstdint>
 
 #include "reader/Chunk.h"
-#include "reader/ChunkIds.h"
 
 namespace Chunks {
 namespace FMT {
 
 class FMTChunk : public Chunk {
 public:
+    /// This parser's bit in the stream's chunk masks.
+    static constexpr unsigned int kMaskBit = 1u << 1;
+
     /// Accepts compression codes 1 (PCM), 3 (float) and 0xFFFE (extensible
     /// with sub-format 1 or 3, or with a short extension that names none).
     bool InitChunkFromStream(const ChunkHeader_t& header, FILE* file, bool wrongEndian) override;

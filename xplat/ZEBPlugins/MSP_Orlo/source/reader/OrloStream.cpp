@@ -4,20 +4,12 @@
 #include <stdexcept>
 #include <vector>
 
-#include "reader/BEXTChunk.h"
-#include "reader/COMMChunk.h"
 #include "reader/CalcBytesRemaining.h"
 #include "reader/ConvertStrToChunkType.h"
-#include "reader/DATAChunk.h"
-#include "reader/DS64Chunk.h"
-#include "reader/FMTChunk.h"
-#include "reader/IXMLChunk.h"
 #include "reader/PerformAdditionalInitialization.h"
 #include "reader/ReadBytes.h"
 #include "reader/ReadValue.h"
-#include "reader/SSNDChunk.h"
 #include "reader/StreamErrors.h"
-#include "reader/UMIDChunk.h"
 
 namespace Orlo {
 
@@ -28,14 +20,7 @@ const std::string kHeaderMessage = "Expected chunk header";
 
 OrloStream::OrloStream(const char* path, unsigned int chunks) {
     // One parser per type, made before the file opens.
-    m_ChunkTable[DS64_CHUNK] = std::make_shared<Chunks::DS64::DS64Chunk>();
-    m_ChunkTable[FMT_CHUNK] = std::make_shared<Chunks::FMT::FMTChunk>();
-    m_ChunkTable[DATA_CHUNK] = std::make_shared<Chunks::DATA::DATAChunk>(this);
-    m_ChunkTable[COMM_CHUNK] = std::make_shared<Chunks::COMM::COMMChunk>();
-    m_ChunkTable[SSND_CHUNK] = std::make_shared<Chunks::SSND::SSNDChunk>();
-    m_ChunkTable[BEXT_CHUNK] = std::make_shared<Chunks::BEXT::BEXTChunk>();
-    m_ChunkTable[IXML_CHUNK] = std::make_shared<Chunks::IXML::IXMLChunk>();
-    m_ChunkTable[UMID_CHUNK] = std::make_shared<Chunks::UMID::UMIDChunk>();
+    for (const ChunkTableRow& row : kChunkTable) m_Parsers[row.bit] = row.makeParser(*this);
 
     try {
         m_FullFileName = path ? path : "";
@@ -133,8 +118,8 @@ void OrloStream::ReadAndInitChunk(Chunks::ChunkHeader_t header) {
     // Parsers see the padded size; 0xFFFFFFFF wraps to 0.
     if (header.chunkSize & 1) header.chunkSize += 1;
     const unsigned int type = ConvertStrToChunkType(header.chunkId);
-    const auto parser = m_ChunkTable.find(static_cast<SupportedChunks>(type));
-    if (parser == m_ChunkTable.end()) {
+    const auto parser = m_Parsers.find(type);
+    if (parser == m_Parsers.end()) {
         if (header.chunkSize != 0) {
             fseeko(m_File, header.chunkSize, SEEK_CUR);
         } else if (header.chunkId.empty()) {
@@ -154,8 +139,8 @@ void OrloStream::ReadAndInitChunk(Chunks::ChunkHeader_t header) {
 
 template <typename First, typename Second, typename Value, typename Get>
 Value OrloStream::FromFirstAccepted(Get get) const {
-    if (HasChunk(ChunkKey<First>::value)) return get(*GetChunk<First>());
-    if (HasChunk(ChunkKey<Second>::value)) return get(*GetChunk<Second>());
+    if (HasChunk(First::kMaskBit)) return get(*GetChunk<First>());
+    if (HasChunk(Second::kMaskBit)) return get(*GetChunk<Second>());
     throw std::logic_error(kNoValue);
 }
 

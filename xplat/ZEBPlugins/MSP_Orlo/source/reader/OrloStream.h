@@ -8,54 +8,28 @@
 #include <memory>
 #include <string>
 
-#include "reader/Chunk.h"
-
-namespace Chunks {
-namespace DS64 {
-class DS64Chunk;
-}
-namespace FMT {
-class FMTChunk;
-}
-namespace DATA {
-class DATAChunk;
-}
-namespace BEXT {
-class BEXTChunk;
-}
-namespace IXML {
-class IXMLChunk;
-}
-namespace UMID {
-class UMIDChunk;
-}
-namespace COMM {
-class COMMChunk;
-}
-namespace SSND {
-class SSNDChunk;
-}
-}  // namespace Chunks
+#include "reader/ChunkTable.h"
 
 namespace Orlo {
 
 class OrloStream {
 public:
-    /// One bit per chunk type with a parser: a mask of accepted chunks and the
-    /// keys of the chunk table.
+    /// Names for the parsers' bits. A mask of chunks is any OR of the bits of
+    /// kChunkTable's rows; kAllChunks holds them all.
     enum SupportedChunks : unsigned int {
-        DS64_CHUNK = 1,
-        FMT_CHUNK = 2,
-        DATA_CHUNK = 4,
-        BEXT_CHUNK = 8,
-        IXML_CHUNK = 16,
-        UMID_CHUNK = 32,
-        COMM_CHUNK = 64,
-        SSND_CHUNK = 128,
+        DS64_CHUNK = Chunks::DS64::DS64Chunk::kMaskBit,
+        FMT_CHUNK = Chunks::FMT::FMTChunk::kMaskBit,
+        DATA_CHUNK = Chunks::DATA::DATAChunk::kMaskBit,
+        BEXT_CHUNK = Chunks::BEXT::BEXTChunk::kMaskBit,
+        IXML_CHUNK = Chunks::IXML::IXMLChunk::kMaskBit,
+        UMID_CHUNK = Chunks::UMID::UMIDChunk::kMaskBit,
+        COMM_CHUNK = Chunks::COMM::COMMChunk::kMaskBit,
+        SSND_CHUNK = Chunks::SSND::SSNDChunk::kMaskBit,
     };
 
     /// Walks the file at `path` (UTF-8). Never throws for a bad file: read the
-    /// outcome from GetError(). Any `chunks` other than 0 reads all chunks.
+    /// outcome from GetError(). Any `chunks` other than 0 reads all chunks; pass
+    /// kAllChunks.
     OrloStream(const char* path, unsigned int chunks);
 
     OrloStream(const OrloStream&) = delete;
@@ -65,8 +39,8 @@ public:
     const char* GetError() const { return m_Error; }
     /// True when any bit of `chunks` was accepted.
     bool HasChunk(unsigned int chunks) const { return (m_ChunksSeen & chunks) != 0; }
-    /// The parser of class T, accepted or not; null for a chunk type whose
-    /// parser is not in the table. Shared with the stream.
+    /// The parser of class T, accepted or not; null for a parser class that
+    /// has no row in kChunkTable. Shared with the stream.
     template <typename T>
     std::shared_ptr<T> GetChunk() const;
 
@@ -113,50 +87,15 @@ private:
     const char* m_Error = nullptr;
     FILE* m_File = nullptr;
     std::string m_FullFileName;
-    uint16_t m_ChunksSeen = 0;
-    std::map<SupportedChunks, std::shared_ptr<Chunks::Chunk>> m_ChunkTable;
-};
-
-/// The table key of each parser class.
-template <typename T>
-struct ChunkKey;
-template <>
-struct ChunkKey<Chunks::DS64::DS64Chunk> {
-    static constexpr OrloStream::SupportedChunks value = OrloStream::DS64_CHUNK;
-};
-template <>
-struct ChunkKey<Chunks::FMT::FMTChunk> {
-    static constexpr OrloStream::SupportedChunks value = OrloStream::FMT_CHUNK;
-};
-template <>
-struct ChunkKey<Chunks::DATA::DATAChunk> {
-    static constexpr OrloStream::SupportedChunks value = OrloStream::DATA_CHUNK;
-};
-template <>
-struct ChunkKey<Chunks::BEXT::BEXTChunk> {
-    static constexpr OrloStream::SupportedChunks value = OrloStream::BEXT_CHUNK;
-};
-template <>
-struct ChunkKey<Chunks::IXML::IXMLChunk> {
-    static constexpr OrloStream::SupportedChunks value = OrloStream::IXML_CHUNK;
-};
-template <>
-struct ChunkKey<Chunks::UMID::UMIDChunk> {
-    static constexpr OrloStream::SupportedChunks value = OrloStream::UMID_CHUNK;
-};
-template <>
-struct ChunkKey<Chunks::COMM::COMMChunk> {
-    static constexpr OrloStream::SupportedChunks value = OrloStream::COMM_CHUNK;
-};
-template <>
-struct ChunkKey<Chunks::SSND::SSNDChunk> {
-    static constexpr OrloStream::SupportedChunks value = OrloStream::SSND_CHUNK;
+    unsigned int m_ChunksSeen = 0;
+    /// One parser per row of kChunkTable, by its bit.
+    std::map<unsigned int, std::shared_ptr<Chunks::Chunk>> m_Parsers;
 };
 
 template <typename T>
 std::shared_ptr<T> OrloStream::GetChunk() const {
-    const auto found = m_ChunkTable.find(ChunkKey<T>::value);
-    return found == m_ChunkTable.end() ? nullptr : std::static_pointer_cast<T>(found->second);
+    const auto found = m_Parsers.find(T::kMaskBit);
+    return found == m_Parsers.end() ? nullptr : std::static_pointer_cast<T>(found->second);
 }
 
 }  // namespace Orlo

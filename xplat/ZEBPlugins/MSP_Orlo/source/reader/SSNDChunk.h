@@ -4,13 +4,15 @@
 #include <cstdint>
 
 #include "reader/Chunk.h"
-#include "reader/ChunkIds.h"
 
 namespace Chunks {
 namespace SSND {
 
 class SSNDChunk : public Chunk {
 public:
+    /// This parser's bit in the stream's chunk masks.
+    static constexpr unsigned int kMaskBit = 1u << 7;
+
     /// Refuses a chunk under 8 bytes.
     bool InitChunkFromStream(const ChunkHeader_t& header, FILE* file, bool wrongEndian) override;
     /// Sample size = whole bytes of `bits`.

@@ -1,4 +1,5 @@
-# The audio file reader: the chunk stream, its parsers and their file helpers.
+# The audio file reader: the chunk stream, its parsers and their file helpers;
+# in ixml/ the iXML chunk, its text parsers and the document read.
 target_sources(OrloPlugin PRIVATE
     ${CMAKE_CURRENT_LIST_DIR}/BEXTChunk.cpp
     ${CMAKE_CURRENT_LIST_DIR}/COMMChunk.cpp
@@ -8,14 +9,14 @@ target_sources(OrloPlugin PRIVATE
     ${CMAKE_CURRENT_LIST_DIR}/DS64Chunk.cpp
     ${CMAKE_CURRENT_LIST_DIR}/ExtendedFloat.cpp
     ${CMAKE_CURRENT_LIST_DIR}/FMTChunk.cpp
-    ${CMAKE_CURRENT_LIST_DIR}/IXMLChunk.cpp
-    ${CMAKE_CURRENT_LIST_DIR}/IXMLTextParsers.cpp
     ${CMAKE_CURRENT_LIST_DIR}/OrloStream.cpp
-    ${CMAKE_CURRENT_LIST_DIR}/ParceRawIXML.cpp
     ${CMAKE_CURRENT_LIST_DIR}/ParseOriginationTime.cpp
     ${CMAKE_CURRENT_LIST_DIR}/PerformAdditionalInitialization.cpp
     ${CMAKE_CURRENT_LIST_DIR}/ReadBytes.cpp
     ${CMAKE_CURRENT_LIST_DIR}/SSNDChunk.cpp
     ${CMAKE_CURRENT_LIST_DIR}/SplitString.cpp
     ${CMAKE_CURRENT_LIST_DIR}/UMIDChunk.cpp
-    ${CMAKE_CURRENT_LIST_DIR}/int24.cpp)
+    ${CMAKE_CURRENT_LIST_DIR}/int24.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/ixml/IXMLChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/ixml/IXMLTextParsers.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/ixml/ParceRawIXML.cpp)

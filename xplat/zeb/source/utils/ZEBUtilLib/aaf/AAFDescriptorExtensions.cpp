@@ -3,6 +3,7 @@
 #include <string>
 
 #include "AAFComPtr.h"
+#include "tov/sdk/TOVFailureStyle.h"
 
 namespace ZEB {
 namespace AAFUtils {
@@ -20,16 +21,13 @@ T* Use(const AAFComPtr<T>& p) {
     return p.get();
 }
 
+/// The bodies here return nothing: getting to the end is success.
 template <class Body>
 TOVRESULT Guarded(Body&& body) {
-    try {
+    return TOVGuarded([&] {
         body();
         return TOV_OK;
-    } catch (int result) {
-        return result;
-    } catch (...) {
-        return TOV_E_UNEXPECTED;
-    }
+    });
 }
 
 template <class I, class From>

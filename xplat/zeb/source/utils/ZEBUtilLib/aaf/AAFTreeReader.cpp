@@ -5,6 +5,7 @@
 #include <vector>
 
 #include "AAFComPtr.h"
+#include "identity/IDText.h"
 #include "strings/UTFConversions.h"
 
 namespace ZEB {
@@ -27,36 +28,14 @@ std::string NameOf(Named* named) {
     return wToUTF8(buffer.data());
 }
 
-std::string Hex(const aafUInt8* bytes, size_t count) {
-    std::string out;
-    char part[3];
-    for (size_t i = 0; i < count; ++i) {
-        std::snprintf(part, sizeof part, "%02x", bytes[i]);
-        out += part;
-    }
-    return out;
-}
-
 /// The text form of the identifier sheet: {Data1-Data2-Data3-Data4[0..1]-Data4[2..7]}.
-std::string UIDText(const aafUID_t& id) {
-    char text[64];
-    std::snprintf(text, sizeof text, "{%08X-%04X-%04X-%02X%02X-%02X%02X%02X%02X%02X%02X}", id.Data1, id.Data2, id.Data3,
-                  id.Data4[0], id.Data4[1], id.Data4[2], id.Data4[3], id.Data4[4], id.Data4[5], id.Data4[6],
-                  id.Data4[7]);
-    return text;
-}
+std::string UIDText(const aafUID_t& id) { return "{" + GUIDText(id, HexCase::Upper) + "}"; }
 
 /// A Mob ID in the SMPTE URN form of a UMID.
 std::string MobIDText(const aafMobID_t& id) {
-    const aafUInt8* label = id.SMPTELabel;
-    char text[128];
-    std::snprintf(
-        text, sizeof text,
-        "urn:smpte:umid:%02x%02x%02x%02x.%02x%02x%02x%02x.%02x%02x%02x%02x.%02x%02x%02x%02x.%08x.%04x.%04x.%s",
-        label[0], label[1], label[2], label[3], label[4], label[5], label[6], label[7], label[8], label[9], label[10],
-        label[11], id.length, id.instanceHigh, id.instanceMid, id.instanceLow, id.material.Data1, id.material.Data2,
-        id.material.Data3, Hex(id.material.Data4, 8).c_str());
-    return text;
+    std::string text = MobIDDigits(id, HexCase::Lower);
+    for (int at : {48, 44, 40, 32, 24, 16, 8}) text.insert(static_cast<size_t>(at), 1, '.');
+    return "urn:smpte:umid:" + text;
 }
 
 aafUID_t TypeID(IAAFTypeDef* type) {
@@ -232,7 +211,7 @@ AAFDumpNode AAFTreeReader::ReadArray(IAAFTypeDef* type, IAAFPropertyValue* value
     if (TypeID(elementType.get()) == kAAFTypeID_UInt8) {
         std::vector<aafUInt8> bytes(count);
         if (count) Check(array->GetCArray(value, bytes.data(), count));
-        return Leaf(AAFDumpNode::Kind::Text, Hex(bytes.data(), bytes.size()));
+        return Leaf(AAFDumpNode::Kind::Text, HexText(bytes.data(), bytes.size(), HexCase::Lower));
     }
     AAFDumpNode node;
     node.kind = AAFDumpNode::Kind::List;

@@ -43,7 +43,8 @@ TOVRESULT ZEBInitializeInternal(ITOVComponentFactory* factory, unsigned char*) {
     using namespace ZEBUtilLib;
     // The count stays raised on a repeated start, so a later ZEBTerminate pays for it.
     if (gZEBRef++ != 0) return ZEB_E_ALREADYSET;
-    try {
+    bool started = false;
+    const TOVRESULT result = TOVGuarded([&] {
         if (!factory) throw static_cast<int>(TOV_E_POINTER);
         factory->AddRef();
         gpComponentFactory = factory;
@@ -56,19 +57,15 @@ TOVRESULT ZEBInitializeInternal(ITOVComponentFactory* factory, unsigned char*) {
         TOVCheck(factory->QueryInterface(IID_ITOVConsole, reinterpret_cast<void**>(&gpConsole)));
         if (!gpConsole) throw static_cast<int>(TOV_E_POINTER);
         gpConsole->Write(kTOVDebugLevelStartup, L"ZEBUtilLib initialized");
+        started = true;
         return TOV_OK;
-    } catch (...) {
+    });
+    if (!started) {
         // A failed start leaves nothing behind, so it can be tried again.
         ReleaseGlobals();
         --gZEBRef;
-        try {
-            throw;
-        } catch (int result) {
-            return result;
-        } catch (...) {
-            return TOV_E_UNEXPECTED;
-        }
     }
+    return result;
 }
 
 TOVRESULT ZEBTerminate() {

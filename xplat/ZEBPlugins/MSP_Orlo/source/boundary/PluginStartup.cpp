@@ -1,14 +1,14 @@
-#include "PluginStartup.h"
+#include "boundary/PluginStartup.h"
 
 #include "boundary/DynamicToggles.h"
 #include "boundary/ModuleGlobals.h"
 #include "tov/sdk/TOVFailureStyle.h"
 
-PluginStartup::PluginStartup(TOVHost& host) {
+PluginStartup::PluginStartup(ITOVUnknown* host) {
     m_Result = TOVGuarded([&] {
-        OrloReader::InitOrloReader(host.AsUnknown());
+        OrloReader::InitOrloReader(host);
         void* console = nullptr;
-        TOVCheck(host.QueryInterface(IID_ITOVConsole, &console));
+        TOVCheck(host->QueryInterface(IID_ITOVConsole, &console));
         g_pConsole = static_cast<ITOVConsole*>(console);
         TOVPtr<ITOVComponentFactory> factory;
         factory.Assign(OrloReader::s_pComponentFactory);

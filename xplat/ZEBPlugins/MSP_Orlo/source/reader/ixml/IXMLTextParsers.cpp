@@ -1,10 +1,10 @@
-#include "reader/IXMLTextParsers.h"
+#include "reader/ixml/IXMLTextParsers.h"
 
 #include <locale>
 #include <sstream>
 
-#include "reader/IXMLElements.h"
 #include "reader/SplitString.h"
+#include "reader/ixml/IXMLElements.h"
 
 namespace Chunks {
 namespace IXML {

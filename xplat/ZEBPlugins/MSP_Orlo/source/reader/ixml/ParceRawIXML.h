@@ -3,7 +3,7 @@
 /// model. Kept apart from the chunk walk because the model needs the host.
 #include <string>
 
-#include "reader/IXMLData.h"
+#include "reader/ixml/IXMLData.h"
 #include "tov/ITOVComponentFactory.h"
 #include "xml/ZEBXmlElement.h"
 

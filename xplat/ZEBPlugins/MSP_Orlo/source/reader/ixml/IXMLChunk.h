@@ -4,13 +4,15 @@
 #include <string>
 
 #include "reader/Chunk.h"
-#include "reader/ChunkIds.h"
 
 namespace Chunks {
 namespace IXML {
 
 class IXMLChunk : public Chunk {
 public:
+    /// This parser's bit in the stream's chunk masks.
+    static constexpr unsigned int kMaskBit = 1u << 4;
+
     /// Refuses an empty chunk. Reads the whole padded payload, cuts it after
     /// its last ">" (recorders pad behind the root element) and corrects the
     /// first "encording" to "encoding" (a writer misspells its declaration).

@@ -1,8 +1,8 @@
-#include "reader/IXMLChunk.h"
+#include "reader/ixml/IXMLChunk.h"
 
-#include "reader/IXMLTextParsers.h"
 #include "reader/ReadBytes.h"
 #include "reader/ReadValue.h"
+#include "reader/ixml/IXMLTextParsers.h"
 
 namespace Chunks {
 namespace IXML {

@@ -1,11 +1,12 @@
-#include "reader/ParceRawIXML.h"
+#include "reader/ixml/ParceRawIXML.h"
 
 #include <optional>
 #include <string_view>
 #include <vector>
 
-#include "reader/IXMLElements.h"
-#include "reader/IXMLTextParsers.h"
+#include "reader/ixml/IXMLElements.h"
+#include "reader/ixml/IXMLTextParsers.h"
+#include "tov/sdk/TOVFailureStyle.h"
 #include "xml/ZEBXmlDoc.h"
 
 namespace Chunks {
@@ -161,7 +162,7 @@ void GetTrackFromXMLWithNameCheck(ZEBXmlElement* element, IXMLData* data) {
 }
 
 TOVRESULT ParceRawIXML(const std::string& rawXml, ITOVComponentFactory* factory, IXMLData& data) {
-    try {
+    return TOVGuarded([&] {
         // A zero byte ends the text, as it ends any C string.
         const ZEBString text(reinterpret_cast<const unsigned char*>(rawXml.c_str()));
         ZEB::XMLUtils::ZEBXmlDoc document(factory);
@@ -189,11 +190,7 @@ TOVRESULT ParceRawIXML(const std::string& rawXml, ITOVComponentFactory* factory,
 
         data.parsed = true;
         return TOV_OK;
-    } catch (int result) {
-        return result;
-    } catch (...) {
-        return TOV_E_UNEXPECTED;
-    }
+    });
 }
 
 }  // namespace IXML

@@ -1,0 +1,8 @@
+# The module's boundary: its globals and start-up, what it says of itself, the
+# toggles, the host's grouping setting and the Movie of one file.
+target_sources(OrloPlugin PRIVATE
+    ${CMAKE_CURRENT_LIST_DIR}/AudioImportSettings.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/DynamicToggles.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/ModuleGlobals.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/NewMovieFromFilePath.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/PluginStartup.cpp)
