@@ -27,7 +27,7 @@ void ReaderFixture::TearDown() { ZEB::ZEBTerminate(); }
 std::unique_ptr<Orlo::OrloStream> ReaderFixture::Open(const std::string& bytes) {
     TempFile file(bytes);
     const int before = OpenDescriptorCount();
-    auto stream = std::make_unique<Orlo::OrloStream>(file.Path().c_str(), 255);
+    auto stream = std::make_unique<Orlo::OrloStream>(file.Path().c_str(), Orlo::kAllChunks);
     EXPECT_EQ(OpenDescriptorCount(), before) << "the stream must close its file on every path";
     return stream;
 }

@@ -102,7 +102,7 @@ using WaveStream = ReaderFixture;
 using Ds64Chunk = ReaderFixture;
 
 TEST_F(WaveStream, FailsOnAMissingFileAndOnNoChunksAskedFor) {
-    EXPECT_STREQ(OrloStream("/nonexistent/orlo/take.wav", 255).GetError(), "File could not be opened");
+    EXPECT_STREQ(OrloStream("/nonexistent/orlo/take.wav", Orlo::kAllChunks).GetError(), "File could not be opened");
     TempFile file(WaveFmt().Chunk("data", Samples(6)).Bytes());
     EXPECT_STREQ(OrloStream(file.Path().c_str(), 0).GetError(), "No chunks specified for reading!");
 }
@@ -275,7 +275,7 @@ TEST_F(WaveStream, RF64SizesBeyondFourGiB) {
     const std::string head = RF64With(dataSize, dataSize / 6).ChunkWithSize("data", 0xFFFFFFFF, "", false).Bytes();
     TempFile file(head);
     ASSERT_EQ(truncate(file.Path().c_str(), static_cast<off_t>(head.size() + dataSize)), 0);
-    OrloStream stream(file.Path().c_str(), 255);
+    OrloStream stream(file.Path().c_str(), Orlo::kAllChunks);
     ASSERT_EQ(stream.GetError(), nullptr);
     const uint64_t frames = dataSize / 6;
     EXPECT_EQ(stream.GetSampleCount(), frames);
