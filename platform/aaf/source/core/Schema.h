@@ -55,12 +55,20 @@ public:
     /// order in which an object lists its properties.
     aafUInt32 NextPropertySerial() { return m_nextSerial++; }
 
+    /// Counts the changes to this file's objects that a lookup table kept
+    /// beside an object cannot follow: removals, insertions before the end,
+    /// every value reached through the generic interfaces, a slot's new id.
+    /// A table made at another count is made again.
+    aafUInt64 ChangeCount() const { return m_changes; }
+    void NoteChange() { ++m_changes; }
+
 private:
     Schema();
     ~Schema();
 
     aafUInt32 m_refs = 0;
     aafUInt32 m_nextSerial = 0;
+    aafUInt64 m_changes = 0;
     std::vector<std::unique_ptr<ClassDefinition>> m_classes;
     std::vector<std::unique_ptr<TypeDefinition>> m_types;
     std::vector<std::unique_ptr<DataDefinition>> m_dataDefs;
