@@ -450,6 +450,32 @@ TEST_F(AAFModel, SlotLookupInAManySlotMob) {
     EXPECT_EQ(count, 40u);
 }
 
+// Opening a file reuses what released files leave; nothing one registered,
+// added or renamed reaches the next.
+TEST(AAFLibrary, AFileSeesNoneOfAReleasedFilesDefinitions) {
+    const aafUID_t propId = {0x11111111, 0x2222, 0x3333, {5, 5, 5, 5, 5, 5, 5, 5}};
+    const aafUID_t classId = {0x7E57C1A5, 9, 9, {9, 9, 9, 9, 9, 9, 9, 9}};
+    for (bool rename : {false, true}) {
+        for (int file = 0; file < 2; ++file) {
+            TransientFile f(&AAFFileOpenTransient);
+            Ptr<IAAFClassDef> essence, registered;
+            ASSERT_EQ(f.dictionary->LookupClassDef(kAAFClassID_EssenceDescriptor, essence.out()), AAFRESULT_SUCCESS);
+            Ptr<IAAFPropertyDef> prop;
+            EXPECT_EQ(essence->LookupPropertyDef(propId, prop.out()), AAFRESULT_PROPERTY_NOT_FOUND);
+            EXPECT_EQ(f.dictionary->LookupClassDef(classId, registered.out()), AAFRESULT_OBJECT_NOT_FOUND);
+            aafCharacter name[64] = {};
+            ASSERT_EQ(essence->GetName(name, sizeof name), AAFRESULT_SUCCESS);
+            EXPECT_STREQ(name, L"EssenceDescriptor");
+            Ptr<IAAFTypeDef> type;
+            f.dictionary->LookupTypeDef(kAAFTypeID_UInt32, type.out());
+            ASSERT_EQ(essence->RegisterOptionalPropertyDef(propId, L"Extra", type.get(), prop.out()),
+                      AAFRESULT_SUCCESS);
+            ASSERT_TRUE(f.RegisterConcreteClass(classId, kAAFClassID_SourceMob, L"Extra"));
+            if (rename) Query<IAAFMetaDefinition>(essence.get())->SetName(L"Renamed");
+        }
+    }
+}
+
 TEST(AAFLibrary, ResultTextsAndVersion) {
     aafProductVersion_t version{};
     EXPECT_EQ(AAFGetLibraryVersion(&version), AAFRESULT_SUCCESS);
