@@ -92,18 +92,25 @@ void AddDescriptorLocation(const ZEBString& path, IAAFDictionary* dictionary, IA
     TOVCheck(AAFUtils::SetMediaContainerGUID(dictionary, descriptor, OrloRegInfo::CompID_OrloReaderMovContainer));
 }
 
-TOVRESULT Build(Movie& movie, const ZEBString& path, IAAFFile** out) {
-    ZEBString widePath(path);
-    widePath.ConvertTo(kTOVUnicodeWCHAR);
-
+// The empty transient file of one clip, named as the plug-in's. A build that
+// fails after this leaves the file allocated, by design: the leak checker of
+// the builder's tests lets go of what this allocates, and of nothing else.
+IAAFFile* OpenTransientClipFile() {
     _aafProductIdentification_t product;
     GetProductID(product, OrloRegInfo::kVersionMajor, OrloRegInfo::kVersionMinor, OrloRegInfo::kVersionPatch,
                  OrloRegInfo::kVersionBuild, OrloRegInfo::kVendorName, OrloRegInfo::kPluginName,
                  OrloRegInfo::kVersionWideText, OrloRegInfo::CompID_OrloReaderMovContainer);
-    // Held plainly: on a failure the file is neither closed nor released, so
-    // it stays allocated (the test build's leak checker is told so).
     IAAFFile* file = nullptr;
     TOVCheck(AAFFileOpenTransient(&product, &file));
+    return file;
+}
+
+TOVRESULT Build(Movie& movie, const ZEBString& path, IAAFFile** out) {
+    ZEBString widePath(path);
+    widePath.ConvertTo(kTOVUnicodeWCHAR);
+
+    // Held plainly: a failure below neither closes nor releases the file.
+    IAAFFile* file = OpenTransientClipFile();
     IAAFSmartPointer<IAAFHeader> header;
     TOVCheck(IAAFSmartPointer<IAAFFile>(file)->GetHeader(&header));
     IAAFSmartPointer<IAAFDictionary> dictionary;
