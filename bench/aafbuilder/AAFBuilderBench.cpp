@@ -261,32 +261,15 @@ void BM_WideFile_MovieAndClip(benchmark::State& state) {
     state.counters["peak_MiB"] = static_cast<double>(usage.ru_maxrss) / 1024.0;
 }
 
-constexpr int kRepetitions = 9;
-BENCHMARK(BM_ExampleTake_1_OpenTransientFile)
-    ->UseManualTime()
-    ->Unit(benchmark::kMicrosecond)
-    ->Repetitions(kRepetitions)
-    ->ReportAggregatesOnly();
-BENCHMARK(BM_ExampleTake_2_MobsAndSlots)
-    ->UseManualTime()
-    ->Unit(benchmark::kMicrosecond)
-    ->Repetitions(kRepetitions)
-    ->ReportAggregatesOnly();
-BENCHMARK(BM_ExampleTake_3_Descriptors)
-    ->UseManualTime()
-    ->Unit(benchmark::kMicrosecond)
-    ->Repetitions(kRepetitions)
-    ->ReportAggregatesOnly();
-BENCHMARK(BM_ExampleTake_4_Comments)
-    ->UseManualTime()
-    ->Unit(benchmark::kMicrosecond)
-    ->Repetitions(kRepetitions)
-    ->ReportAggregatesOnly();
-BENCHMARK(BM_ExampleTake_NewAAFFromMovie)
-    ->UseManualTime()
-    ->Unit(benchmark::kMicrosecond)
-    ->Repetitions(kRepetitions)
-    ->ReportAggregatesOnly();
+// The median of nine runs, each in this thread's processor time.
+void Repeated(benchmark::internal::Benchmark* b) {
+    b->UseManualTime()->Unit(benchmark::kMicrosecond)->Repetitions(9)->ReportAggregatesOnly();
+}
+BENCHMARK(BM_ExampleTake_1_OpenTransientFile)->Apply(Repeated);
+BENCHMARK(BM_ExampleTake_2_MobsAndSlots)->Apply(Repeated);
+BENCHMARK(BM_ExampleTake_3_Descriptors)->Apply(Repeated);
+BENCHMARK(BM_ExampleTake_4_Comments)->Apply(Repeated);
+BENCHMARK(BM_ExampleTake_NewAAFFromMovie)->Apply(Repeated);
 BENCHMARK(BM_WideFile_MovieAndClip)->Arg(65535)->Unit(benchmark::kMillisecond)->Iterations(1);
 
 }  // namespace
