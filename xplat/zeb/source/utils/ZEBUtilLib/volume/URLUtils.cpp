@@ -16,6 +16,8 @@ namespace {
 
 bool NeedsEscape(wchar_t c) { return c != L'\0' && std::wcschr(kCharactersNeedingEscape, c) != nullptr; }
 
+// A server's name follows two slashes or two backslashes; one of each is no
+// such name.
 bool StartsWithTwo(const wchar_t* text, wchar_t separator) { return text[0] == separator && text[1] == separator; }
 
 std::wstring EscapedURL(const wchar_t* path) {
