@@ -26,6 +26,6 @@ cmake --build "$dir" -j "$(nproc)" --target "$target" fuzz_seed_corpus
 corpus=$(mktemp -d)
 trap 'rm -rf "$corpus"' EXIT
 cp "$seeds/"* "$corpus/"
-ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 \
+ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 LSAN_OPTIONS=suppressions="$root/tests/lsan.supp" \
     "$dir/bin/$target" -max_total_time="$seconds" -timeout=10 -rss_limit_mb=2048 \
     -artifact_prefix="$dir/" -print_final_stats=1 "$corpus"

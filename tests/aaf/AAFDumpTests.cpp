@@ -4,13 +4,12 @@
 // the golden files.
 #include <gtest/gtest.h>
 
-#include <cstdlib>
-#include <fstream>
 #include <sstream>
 #include <string>
 
 #include "AAFTestFile.h"
 #include "ExampleClips.h"
+#include "GoldenDump.h"
 #include "aaf/dumpAAF.h"
 
 using namespace aaftest;
@@ -24,13 +23,7 @@ std::string Dump(IAAFFile* file, ZEB::AAFDumpOptions options) {
 }
 
 void CompareWithGolden(const std::string& dump, const std::string& name) {
-    const std::string path = std::string(AAF_GOLDEN_DIR) + "/" + name;
-    if (std::getenv("ORLO_UPDATE_GOLDEN")) std::ofstream(path) << dump;
-    std::ifstream in(path);
-    ASSERT_TRUE(in) << "missing golden file " << path;
-    std::stringstream golden;
-    golden << in.rdbuf();
-    EXPECT_EQ(dump, golden.str()) << "dump differs from " << path;
+    ExpectMatchesGolden(dump, std::string(AAF_GOLDEN_DIR) + "/" + name);
 }
 
 struct GoldenCase {

@@ -320,6 +320,80 @@ TEST_F(AAFClassDef, PictureDescriptorsComeFromACallersConcreteClass) {
     EXPECT_EQ(picture->GetCompression(&compression), AAFRESULT_PROP_NOT_PRESENT);
 }
 
+// Slot lookups in a Mob of many slots follow new ids, given through the slot
+// or through the generic interfaces, and removals.
+TEST_F(AAFMob, SlotLookupInAManySlotMob) {
+    auto mob = f.Create<IAAFMob>(kAAFClassID_SourceMob);
+    auto source = Query<IAAFSourceMob>(mob.get());
+    ASSERT_EQ(source->Initialize(), AAFRESULT_SUCCESS);
+    const auto slotOf = [&](aafSlotID_t id) {
+        Ptr<IAAFMobSlot> slot;
+        mob->LookupSlot(id, slot.out());
+        return slot;
+    };
+    // The physical number of the slot found by `id`, 0 for none.
+    const auto numberOf = [&](aafSlotID_t id) {
+        aafUInt32 n = 0;
+        auto slot = slotOf(id);
+        return slot && AAFRESULT_SUCCEEDED(slot->GetPhysicalNum(&n)) ? n : 0u;
+    };
+    for (aafSlotID_t id = 1; id <= 40; ++id) {
+        ASSERT_EQ(source->AddNilReference(id, 10, f.DataDef(kAAFDataDef_LegacySound).get(), {25, 1}),
+                  AAFRESULT_SUCCESS);
+        ASSERT_EQ(slotOf(id)->SetPhysicalNum(id), AAFRESULT_SUCCESS);
+    }
+    EXPECT_EQ(numberOf(41), 0u);
+    ASSERT_EQ(slotOf(25)->SetSlotID(99), AAFRESULT_SUCCESS);
+    EXPECT_EQ(numberOf(99), 25u);
+    EXPECT_EQ(numberOf(25), 0u);
+    Ptr<IAAFClassDef> slotClass;
+    Ptr<IAAFPropertyDef> slotID;
+    Ptr<IAAFPropertyValue> value;
+    Ptr<IAAFTypeDef> type;
+    f.dictionary->LookupClassDef(kAAFClassID_MobSlot, slotClass.out());
+    slotClass->LookupPropertyDef(kAAFPropID_MobSlot_SlotID, slotID.out());
+    ASSERT_EQ(Query<IAAFObject>(slotOf(40).get())->GetPropertyValue(slotID.get(), value.out()), AAFRESULT_SUCCESS);
+    value->GetType(type.out());
+    aafUInt32 renumbered = 77;
+    ASSERT_EQ(Query<IAAFTypeDefInt>(type.get())->SetInteger(value.get(), reinterpret_cast<aafMemPtr_t>(&renumbered), 4),
+              AAFRESULT_SUCCESS);
+    EXPECT_EQ(numberOf(77), 40u);
+    ASSERT_EQ(mob->RemoveSlotAt(0), AAFRESULT_SUCCESS);
+    EXPECT_EQ(numberOf(1), 0u);
+    EXPECT_EQ(numberOf(2), 2u);
+}
+
+// Opening a file reuses what released files leave; nothing one registered,
+// added or renamed reaches the next.
+TEST(AAFLibrary, AFileSeesNoneOfAReleasedFilesDefinitions) {
+    const aafUID_t propId = {0x11111111, 0x2222, 0x3333, {5, 5, 5, 5, 5, 5, 5, 5}};
+    const aafUID_t classId = {0x7E57C1A5, 9, 9, {9, 9, 9, 9, 9, 9, 9, 9}};
+    for (bool rename : {false, true}) {
+        for (int file = 0; file < 2; ++file) {
+            TransientFile f(&AAFFileOpenTransient);
+            Ptr<IAAFClassDef> essence, registered;
+            ASSERT_EQ(f.dictionary->LookupClassDef(kAAFClassID_EssenceDescriptor, essence.out()), AAFRESULT_SUCCESS);
+            Ptr<IAAFPropertyDef> prop;
+            EXPECT_EQ(essence->LookupPropertyDef(propId, prop.out()), AAFRESULT_PROPERTY_NOT_FOUND);
+            EXPECT_EQ(f.dictionary->LookupClassDef(classId, registered.out()), AAFRESULT_OBJECT_NOT_FOUND);
+            aafCharacter name[64] = {};
+            ASSERT_EQ(essence->GetName(name, sizeof name), AAFRESULT_SUCCESS);
+            EXPECT_STREQ(name, L"EssenceDescriptor");
+            Ptr<IAAFTypeDef> type;
+            f.dictionary->LookupTypeDef(kAAFTypeID_UInt32, type.out());
+            ASSERT_EQ(essence->RegisterOptionalPropertyDef(propId, L"Extra", type.get(), prop.out()),
+                      AAFRESULT_SUCCESS);
+            ASSERT_TRUE(f.RegisterConcreteClass(classId, kAAFClassID_SourceMob, L"Extra"));
+            if (rename) Query<IAAFMetaDefinition>(essence.get())->SetName(L"Renamed");
+        }
+    }
+}
+
+TEST(AAFLibrary, ResultTextsAndVersion) {
+    aafProductVersion_t version{};
+    EXPECT_EQ(AAFGetLibraryVersion(&version), AAFRESULT_SUCCESS);
+    EXPECT_EQ(AAFGetLibraryVersion(nullptr), AAFRESULT_NULL_PARAM);
+
 TEST(AAFLibrary, ResultTexts) {
     aafUInt32 size = 0;
     ASSERT_EQ(AAFResultToTextBufLen(AAFRESULT_DUPLICATE_MOBID, &size), AAFRESULT_SUCCESS);

@@ -28,6 +28,10 @@ public:
     bool HasProperty(const PropertyDefinition& def) const;
     /// Adds a property definition; throws AAFRESULT_TABLE_DUP_KEY when the id is in use.
     PropertyDefinition* AddProperty(const aafUID_t& id, const std::wstring& name, TypeDefinition& type, bool optional);
+    /// Takes back `def` when it is the property added last.
+    void DropLastProperty(const PropertyDefinition& def) {
+        if (!m_properties.empty() && m_properties.back() == &def) m_properties.pop_back();
+    }
     /// Adds an interface view that instances of this class answer.
     void AddView(const ViewMaker& maker) { m_views.push_back(&maker); }
     const std::vector<const ViewMaker*>& Views() const { return m_views; }

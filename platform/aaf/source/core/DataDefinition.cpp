@@ -80,6 +80,7 @@ AAFRESULT DataDefinition::GetAUID(aafUID_t* pAuid) {
 AAFRESULT DataDefinition::SetName(aafCharacter_constptr pName) {
     return Guarded([&] {
         m_name = WideArg(pName);
+        m_schema.NoteChangedInPlace();
         return AAFRESULT_SUCCESS;
     });
 }
@@ -97,6 +98,7 @@ AAFRESULT DataDefinition::GetNameBufLen(aafUInt32* pBufSize) {
 AAFRESULT DataDefinition::SetDescription(aafCharacter_constptr pDescription) {
     return Guarded([&] {
         m_description = WideArg(pDescription);
+        m_schema.NoteChangedInPlace();
         return AAFRESULT_SUCCESS;
     });
 }

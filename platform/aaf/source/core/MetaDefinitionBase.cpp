@@ -38,6 +38,7 @@ AAFRESULT MetaDefinitionBase::GetAUID(aafUID_t* pAuid) {
 AAFRESULT MetaDefinitionBase::SetName(aafCharacter_constptr pName) {
     return Guarded([&] {
         m_name = WideArg(pName);
+        m_schema.NoteChangedInPlace();
         return AAFRESULT_SUCCESS;
     });
 }
@@ -58,6 +59,7 @@ AAFRESULT MetaDefinitionBase::GetNameBufLen(aafUInt32* pBufSize) {
 AAFRESULT MetaDefinitionBase::SetDescription(aafCharacter_constptr pDescription) {
     return Guarded([&] {
         m_description = WideArg(pDescription);
+        m_schema.NoteChangedInPlace();
         return AAFRESULT_SUCCESS;
     });
 }

@@ -117,6 +117,7 @@ void ModelObject::Assign(const PropertyDefinition& def, const Value& value) {
 void ModelObject::Remove(const PropertyDefinition& def) {
     auto it = std::find_if(m_properties.begin(), m_properties.end(), [&](const Stored& s) { return s.def == &def; });
     if (it == m_properties.end()) return;
+    m_schema->NoteChange();
     for (auto& child : it->value->objects) Detach(*child);
     it->value->owner = nullptr;
     m_properties.erase(it);
@@ -173,12 +174,15 @@ void ModelObject::InsertInto(const PropertyDefinition& def, size_t index, ModelO
     std::shared_ptr<Value> value = Ensure(def);
     if (index > value->objects.size()) throw static_cast<int>(AAFRESULT_BADINDEX);
     Attach(child);
+    // Appending is the one change that lookup tables follow by themselves.
+    if (index != value->objects.size()) m_schema->NoteChange();
     value->objects.insert(value->objects.begin() + static_cast<std::ptrdiff_t>(index), RefPtr<ModelObject>(&child));
 }
 
 RefPtr<ModelObject> ModelObject::RemoveFrom(const PropertyDefinition& def, size_t index) {
     Value* value = Find(def);
     if (!value || index >= value->objects.size()) throw static_cast<int>(AAFRESULT_BADINDEX);
+    m_schema->NoteChange();
     RefPtr<ModelObject> child = value->objects[index];
     value->objects.erase(value->objects.begin() + static_cast<std::ptrdiff_t>(index));
     Detach(*child);

@@ -108,6 +108,15 @@ public:
     static void AttachThrough(Value& value, ModelObject& child);
     static void DetachThrough(Value& value, ModelObject& child);
 
+    /// A lookup table that a view keeps beside this object (a Mob's slots by
+    /// id); it goes with the object. Its user checks it against the schema's
+    /// change count.
+    struct Annex {
+        virtual ~Annex() = default;
+    };
+    Annex* GetAnnex() const { return m_annex.get(); }
+    void SetAnnex(std::unique_ptr<Annex> annex) const { m_annex = std::move(annex); }
+
     /// For the views' Initialize: throws AAFRESULT_ALREADY_INITIALIZED the second time.
     void MarkInitialized();
     bool Initialized() const { return m_initialized; }
@@ -122,6 +131,7 @@ private:
     ModelObject* m_container = nullptr;
     std::vector<Stored> m_properties;
     std::vector<std::pair<const ViewMaker*, std::unique_ptr<ViewBase>>> m_views;
+    mutable std::unique_ptr<Annex> m_annex;
 };
 
 }  // namespace aafmodel

@@ -1,5 +1,7 @@
 #include "Schema.h"
 
+#include <mutex>
+
 #include "BuiltinSchema.h"
 #include "ClassDefinition.h"
 #include "DataDefinition.h"
@@ -25,22 +27,93 @@ Schema::Schema() {
 }
 Schema::~Schema() = default;
 
-Schema* Schema::Create() {
-    auto* schema = new Schema();
-    schema->AddRef();
-    try {
-        BuildBuiltinSchema(*schema);
-    } catch (...) {
-        schema->Release();
-        throw;
+namespace {
+
+// Schemas whose files have gone, as new, for the next files: making the
+// built-in definitions is most of the cost of opening a transient file.
+// Never destroyed, so that a file released late in the process's exit still
+// finds it.
+class IdleSchemas {
+public:
+    static IdleSchemas& Get() {
+        static auto* pool = new IdleSchemas();
+        return *pool;
     }
+    Schema* Take() {
+        std::lock_guard<std::mutex> lock(m_mutex);
+        if (m_idle.empty()) return nullptr;
+        Schema* schema = m_idle.back();
+        m_idle.pop_back();
+        return schema;
+    }
+    /// False when the pool is full.
+    bool Keep(Schema* schema) {
+        std::lock_guard<std::mutex> lock(m_mutex);
+        if (m_idle.size() >= kKept) return false;
+        m_idle.push_back(schema);
+        return true;
+    }
+
+private:
+    // A host works on a few clips at a time.
+    static constexpr size_t kKept = 4;
+    std::mutex m_mutex;
+    std::vector<Schema*> m_idle;
+};
+
+}  // namespace
+
+Schema* Schema::Create() {
+    Schema* schema = IdleSchemas::Get().Take();
+    if (!schema) {
+        schema = new Schema();
+        try {
+            BuildBuiltinSchema(*schema);
+        } catch (...) {
+            delete schema;
+            throw;
+        }
+        schema->m_builtinExtent = schema->Current();
+    }
+    schema->AddRef();
     return schema;
 }
 
 aafUInt32 Schema::Release() {
     const aafUInt32 left = --m_refs;
-    if (left == 0) delete this;
+    if (left == 0 && !(ResetToBuiltins() && IdleSchemas::Get().Keep(this))) delete this;
     return left;
+}
+
+Schema::Extent Schema::Current() const {
+    return Extent{m_classes.size(),    m_types.size(),     m_dataDefs.size(),     m_properties.size(),
+                  m_classOrder.size(), m_typeOrder.size(), m_dataDefOrder.size(), m_nextSerial};
+}
+
+bool Schema::IsBuiltIn(const TypeDefinition& def) const {
+    for (size_t i = 0; i < m_builtinExtent.types; ++i)
+        if (m_types[i].get() == &def) return true;
+    return false;
+}
+
+bool Schema::ResetToBuiltins() {
+    if (!m_reusable) return false;
+    // Newest first, so that each leaves its class as the class's last property.
+    for (size_t i = m_properties.size(); i-- > m_builtinExtent.properties;)
+        m_properties[i]->Owner().DropLastProperty(*m_properties[i]);
+    for (size_t i = m_builtinExtent.classOrder; i < m_classOrder.size(); ++i) m_classById.erase(m_classOrder[i]->Id());
+    for (size_t i = m_builtinExtent.typeOrder; i < m_typeOrder.size(); ++i) m_typeById.erase(m_typeOrder[i]->Id());
+    for (size_t i = m_builtinExtent.dataDefOrder; i < m_dataDefOrder.size(); ++i)
+        m_dataDefById.erase(m_dataDefOrder[i]->Id());
+    m_classOrder.resize(m_builtinExtent.classOrder);
+    m_typeOrder.resize(m_builtinExtent.typeOrder);
+    m_dataDefOrder.resize(m_builtinExtent.dataDefOrder);
+    m_properties.resize(m_builtinExtent.properties);
+    m_classes.resize(m_builtinExtent.classes);
+    m_types.resize(m_builtinExtent.types);
+    m_dataDefs.resize(m_builtinExtent.dataDefs);
+    m_nextSerial = m_builtinExtent.serial;
+    return true;
 }
 
 ClassDefinition* Schema::Own(std::unique_ptr<ClassDefinition> def) {

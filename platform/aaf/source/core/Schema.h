@@ -25,7 +25,15 @@ public:
     static Schema* Create();
 
     aafUInt32 AddRef() { return ++m_refs; }
+    /// The last release gives the schema back to the pool of idle ones when
+    /// it can be made as new again; otherwise it is deleted.
     aafUInt32 Release();
+
+    /// A definition changed in place (a new name or description, a record's
+    /// new layout): this schema cannot be made as new again.
+    void NoteChangedInPlace() { m_reusable = false; }
+    /// True for a type made with the schema, not registered later.
+    bool IsBuiltIn(const TypeDefinition& def) const;
 
     /// Takes ownership of a definition; it is not yet registered.
     ClassDefinition* Own(std::unique_ptr<ClassDefinition> def);
@@ -55,12 +63,35 @@ public:
     /// order in which an object lists its properties.
     aafUInt32 NextPropertySerial() { return m_nextSerial++; }
 
+    /// Counts the changes to this file's objects that a lookup table kept
+    /// beside an object cannot follow: removals, insertions before the end,
+    /// every value reached through the generic interfaces, a slot's new id.
+    /// A table made at another count is made again.
+    aafUInt64 ChangeCount() const { return m_changes; }
+    void NoteChange() { ++m_changes; }
+
 private:
     Schema();
     ~Schema();
 
+    /// Drops what was registered since the built-in definitions were made,
+    /// properties added to built-in classes included. False, and nothing
+    /// dropped, when a definition changed in place.
+    bool ResetToBuiltins();
+
+    /// How far the tables reached when the built-in definitions were complete.
+    struct Extent {
+        size_t classes = 0, types = 0, dataDefs = 0, properties = 0;
+        size_t classOrder = 0, typeOrder = 0, dataDefOrder = 0;
+        aafUInt32 serial = 0;
+    };
+    Extent Current() const;
+
     aafUInt32 m_refs = 0;
     aafUInt32 m_nextSerial = 0;
+    aafUInt64 m_changes = 0;
+    bool m_reusable = true;
+    Extent m_builtinExtent;
     std::vector<std::unique_ptr<ClassDefinition>> m_classes;
     std::vector<std::unique_ptr<TypeDefinition>> m_types;
     std::vector<std::unique_ptr<DataDefinition>> m_dataDefs;

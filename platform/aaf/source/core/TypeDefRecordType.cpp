@@ -2,6 +2,7 @@
 
 #include <cstring>
 
+#include "Schema.h"
 #include "WideText.h"
 
 namespace aafmodel {
@@ -163,6 +164,7 @@ AAFRESULT TypeDefRecordType::RegisterMembers(aafUInt32* pOffsets, aafUInt32 numM
         Require(pOffsets);
         if (!Defined()) throw static_cast<int>(AAFRESULT_NOT_INITIALIZED);
         Layout(std::vector<size_t>(pOffsets, pOffsets + numMembers), structSize);
+        if (m_schema.IsBuiltIn(*this)) m_schema.NoteChangedInPlace();
         return AAFRESULT_SUCCESS;
     });
 }

@@ -3,6 +3,7 @@
 #include "Guard.h"
 #include "InternalIDs.h"
 #include "PropertyValue.h"
+#include "Schema.h"
 
 namespace aafmodel {
 
@@ -21,6 +22,8 @@ Value& TypeDefinition::ValueOf(IAAFPropertyValue* pValue) {
     Require(value);
     Value& v = value->Get();
     if (v.type != this) throw static_cast<int>(AAFRESULT_BAD_TYPE);
+    // The caller may write through it into an object's property.
+    m_schema.NoteChange();
     return v;
 }
 

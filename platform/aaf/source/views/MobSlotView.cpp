@@ -84,6 +84,7 @@ AAFRESULT MobSlotView::SetPhysicalNum(aafUInt32 physicalNum) {
 AAFRESULT MobSlotView::SetSlotID(aafSlotID_t value) {
     return Guarded([&] {
         m_object.SetFixed(*Builtins(m_object).p.slotSlotID, value);
+        m_object.GetSchema().NoteChange();
         return AAFRESULT_SUCCESS;
     });
 }

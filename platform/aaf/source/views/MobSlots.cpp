@@ -1,19 +1,68 @@
 #include "MobSlots.h"
 
+#include <memory>
+#include <unordered_map>
+
 #include "../core/DataDefinition.h"
+#include "../core/PropertyDefinition.h"
 #include "../core/Schema.h"
 #include "ViewSupport.h"
 
 namespace aafmodel {
 
+namespace {
+
+// Up to this many slots a scan is quicker than keeping a table.
+constexpr size_t kSlotsScanned = 16;
+
+// A Mob's slots by id, so that a Mob of many slots is built in linear time.
+// The first of equal ids wins, as in a scan. Slots appended since the last
+// lookup are taken in then; any other change that the schema counts makes
+// the table start again.
+struct SlotIndex final : ModelObject::Annex {
+    aafUInt64 changes = 0;
+    const std::vector<RefPtr<ModelObject>>* slots = nullptr;
+    size_t indexed = 0;
+    std::unordered_map<aafSlotID_t, ModelObject*> byId;
+};
+
+bool SlotHasID(const ModelObject& slot, const PropertyDefinition& slotID, aafSlotID_t id) {
+    aafSlotID_t value = 0;
+    return slot.GetFixed(slotID, value) && value == id;
+}
+
+SlotIndex& CurrentIndex(const ModelObject& mob, const std::vector<RefPtr<ModelObject>>& slots) {
+    auto* index = dynamic_cast<SlotIndex*>(mob.GetAnnex());
+    const aafUInt64 changes = mob.GetSchema().ChangeCount();
+    if (!index || index->changes != changes || index->slots != &slots || index->indexed > slots.size()) {
+        auto fresh = std::make_unique<SlotIndex>();
+        fresh->changes = changes;
+        fresh->slots = &slots;
+        index = fresh.get();
+        mob.SetAnnex(std::move(fresh));
+    }
+    return *index;
+}
+
+}  // namespace
+
 ModelObject* FindSlot(const ModelObject& mob, aafSlotID_t slotID) {
     const BuiltinDefinitions& b = Builtins(mob);
-    if (const auto* slots = mob.FindVector(*b.p.mobSlots))
-        for (const auto& slot : *slots) {
-            aafSlotID_t id = 0;
-            if (slot->GetFixed(*b.p.slotSlotID, id) && id == slotID) return slot.get();
-        }
-    return nullptr;
+    const auto* slots = mob.FindVector(*b.p.mobSlots);
+    if (!slots) return nullptr;
+    if (slots->size() <= kSlotsScanned) {
+        for (const auto& slot : *slots)
+            if (SlotHasID(*slot, *b.p.slotSlotID, slotID)) return slot.get();
+        return nullptr;
+    }
+    SlotIndex& index = CurrentIndex(mob, *slots);
+    for (; index.indexed < slots->size(); ++index.indexed) {
+        ModelObject& slot = *(*slots)[index.indexed];
+        aafSlotID_t id = 0;
+        if (slot.GetFixed(*b.p.slotSlotID, id)) index.byId.emplace(id, &slot);
+    }
+    const auto found = index.byId.find(slotID);
+    return found == index.byId.end() ? nullptr : found->second;
 }
 
 ModelObject& AppendTimelineSlot(ModelObject& mob, const aafRational_t& editRate, ModelObject& segment,

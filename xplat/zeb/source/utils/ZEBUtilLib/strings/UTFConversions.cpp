@@ -130,4 +130,6 @@ std::string wToUTF8(const std::wstring& text) {
     return out;
 }
 
+void wToUTF8(const wchar_t* text, std::string& out) { out = wToUTF8(std::wstring(text)); }
+
 }  // namespace ZEB

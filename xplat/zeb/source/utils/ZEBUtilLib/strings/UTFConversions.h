@@ -14,7 +14,9 @@ void wFromUTF8(const char* text, std::wstring& out);
 std::wstring fromUTF16(const unsigned short* text);
 /// Copies 32-bit units up to the terminator with no decoding.
 std::wstring fromUTF32(const unsigned int* text);
-/// Wide to UTF-8.
+/// Wide to UTF-8; a unit above 0x10FFFF ends in std::range_error.
 std::string wToUTF8(const std::wstring& text);
+/// The same for zero-terminated text; the result replaces `out`'s content.
+void wToUTF8(const wchar_t* text, std::string& out);
 
 }  // namespace ZEB
