@@ -1,8 +1,8 @@
 #pragma once
 #include <string>
-#include <vector>
 
 #include "OrloCommand.h"
+#include "PluginChoices.h"
 
 /// Makes the clip of one file in process, the way the host's container asks
 /// the plug-in for it, and shows the Movie: its attributes, its tracks and the
@@ -16,7 +16,5 @@ public:
 private:
     std::string m_Path;
     bool m_Json = false;
-    /// Each a PATH=VALUE that ToggleSetting::Parse accepted.
-    std::vector<std::string> m_ToggleTexts;
-    bool m_NoAutodetectGroups = false;
+    PluginChoices m_Choices;
 };

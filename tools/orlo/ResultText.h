@@ -9,3 +9,5 @@
 std::string ResultText(TOVRESULT result);
 /// 0 as a number for success, otherwise the code as `ResultText`.
 nlohmann::ordered_json ResultJson(TOVRESULT result);
+/// Says on stderr "orlo: WHAT (CODE)" when `result` is negative; gives `result` back.
+TOVRESULT SayRefused(TOVRESULT result, const std::string& what);

@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "ChunksCommand.h"
+#include "ClipCommand.h"
 #include "OrloOptions.h"
 #include "OrloVersion.h"
 #include "ProbeCommand.h"
@@ -22,6 +23,7 @@ int main(int argc, char** argv) {
     commands.push_back(std::make_unique<VersionCommand>());
     commands.push_back(std::make_unique<ChunksCommand>());
     commands.push_back(std::make_unique<ProbeCommand>());
+    commands.push_back(std::make_unique<ClipCommand>());
     std::vector<CLI::App*> declared;
     for (auto& command : commands) declared.push_back(command->Declare(app));
 
