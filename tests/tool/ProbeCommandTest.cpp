@@ -3,13 +3,12 @@
 // and a file the plug-in cannot read.
 #include <gtest/gtest.h>
 
-#include <cstdlib>
-#include <fstream>
 #include <nlohmann/json.hpp>
 #include <sstream>
 #include <string>
 
 #include "ExampleTake.h"
+#include "GoldenDump.h"
 #include "RunTool.h"
 #include "TempFile.h"
 #include "boundary/OrloConstants.h"
@@ -52,15 +51,7 @@ TEST(ProbeCommand, ExampleTakeMatchesGolden) {
     // The path as given is the only thing that depends on the machine.
     ASSERT_EQ(report["file"], kExample);
     report["file"] = ExampleTake::kFileName;
-    const std::string dump = report.dump(2) + "\n";
-
-    const std::string path = std::string(TOOL_GOLDEN_DIR) + "/probe-12A-T03.json";
-    if (std::getenv("ORLO_UPDATE_GOLDEN")) std::ofstream(path) << dump;
-    std::ifstream in(path);
-    ASSERT_TRUE(in) << "missing golden file " << path;
-    std::stringstream golden;
-    golden << in.rdbuf();
-    EXPECT_EQ(dump, golden.str()) << "output differs from " << path;
+    aaftest::ExpectMatchesGolden(report.dump(2) + "\n", std::string(TOOL_GOLDEN_DIR) + "/probe-12A-T03.json");
 }
 
 // Toggles choose where the Mob ID comes from, and the grouping setting reaches
