@@ -25,11 +25,8 @@ bool IsLoaderFailure(TOVRESULT result) {
 
 CLI::App* ClipCommand::Declare(CLI::App& app) {
     CLI::App* command =
-        app.add_subcommand("clip", "make the AAF clip of an audio file as the host's container does, and show it");
-    command->add_option("FILE", m_Path, "a WAV, Broadcast Wave, RF64, AIFF or AIFF-C file")->required();
-    command->add_flag("--json", m_Json, "one JSON object instead of text");
+        DeclareOn(app, "clip", "make the AAF clip of an audio file as the host's container does, and show it");
     command->add_flag("--no-clock", m_NoClock, "leave out values that carry the clock (creation and change times)");
-    m_Choices.Declare(*command);
     return command;
 }
 

@@ -27,12 +27,7 @@ bool GroupingAllowed(TOVHost& host) {
 }  // namespace
 
 CLI::App* ProbeCommand::Declare(CLI::App& app) {
-    CLI::App* command =
-        app.add_subcommand("probe", "make the clip of an audio file as the host's container does, and show it");
-    command->add_option("FILE", m_Path, "a WAV, Broadcast Wave, RF64, AIFF or AIFF-C file")->required();
-    command->add_flag("--json", m_Json, "one JSON object instead of text");
-    m_Choices.Declare(*command);
-    return command;
+    return DeclareOn(app, "probe", "make the clip of an audio file as the host's container does, and show it");
 }
 
 int ProbeCommand::Run(const OrloOptions& options) {
