@@ -393,8 +393,6 @@ TEST(AAFLibrary, ResultTextsAndVersion) {
     aafProductVersion_t version{};
     EXPECT_EQ(AAFGetLibraryVersion(&version), AAFRESULT_SUCCESS);
     EXPECT_EQ(AAFGetLibraryVersion(nullptr), AAFRESULT_NULL_PARAM);
-
-TEST(AAFLibrary, ResultTexts) {
     aafUInt32 size = 0;
     ASSERT_EQ(AAFResultToTextBufLen(AAFRESULT_DUPLICATE_MOBID, &size), AAFRESULT_SUCCESS);
     std::vector<aafCharacter> text(size / sizeof(aafCharacter));
