@@ -93,17 +93,13 @@ TEST_F(AAFInterfaces, NullArgumentsGiveNullParam) {
 }
 
 TEST_F(AAFDictionary, LookupsOfUnknownIdsFail) {
-    auto mob = NewMasterMob(1);
-    Ptr<IAAFMobSlot> slot;
-    EXPECT_EQ(mob->LookupSlot(7, slot.out()), AAFRESULT_SLOT_NOT_FOUND);
-    Ptr<IAAFClassDef> cls;
-    EXPECT_EQ(f.dictionary->LookupClassDef(kAAFPropID_Mob_Name, cls.out()), AAFRESULT_OBJECT_NOT_FOUND);
-    Ptr<IAAFTypeDef> type;
-    EXPECT_EQ(f.dictionary->LookupTypeDef(kAAFClassID_Mob, type.out()), AAFRESULT_OBJECT_NOT_FOUND);
-    Ptr<IAAFDataDef> def;
-    EXPECT_EQ(f.dictionary->LookupDataDef(kAAFClassID_Mob, def.out()), AAFRESULT_OBJECT_NOT_FOUND);
-    Ptr<IUnknown> abstract;
-    EXPECT_EQ(f.dictionary->CreateInstance(kAAFClassID_Mob, IID_IAAFMob, abstract.out()), AAFRESULT_INVALID_PARAM);
+    // Each result lands in a temporary pointer, which releases whatever it was given.
+    EXPECT_EQ(NewMasterMob(1)->LookupSlot(7, Ptr<IAAFMobSlot>().out()), AAFRESULT_SLOT_NOT_FOUND);
+    EXPECT_EQ(f.dictionary->LookupClassDef(kAAFPropID_Mob_Name, Ptr<IAAFClassDef>().out()), AAFRESULT_OBJECT_NOT_FOUND);
+    EXPECT_EQ(f.dictionary->LookupTypeDef(kAAFClassID_Mob, Ptr<IAAFTypeDef>().out()), AAFRESULT_OBJECT_NOT_FOUND);
+    EXPECT_EQ(f.dictionary->LookupDataDef(kAAFClassID_Mob, Ptr<IAAFDataDef>().out()), AAFRESULT_OBJECT_NOT_FOUND);
+    EXPECT_EQ(f.dictionary->CreateInstance(kAAFClassID_Mob, IID_IAAFMob, Ptr<IUnknown>().out()),
+              AAFRESULT_INVALID_PARAM);
 }
 
 TEST_F(AAFMob, NewPhysSourceRefMakesTheMissingSlotAndReplacesAClip) {

@@ -130,11 +130,7 @@ TEST_F(HostXmlDom, MalformedTextFailsWithAReason) {
 
 class HostXmlWriter : public HostXmlDom {
 protected:
-    TOVPtr<ITOVXmlWriter> writer = [this] {
-        TOVPtr<ITOVXmlWriter> made;
-        EXPECT_EQ(host->CreateComponent(CompID_TOVXmlWriter, nullptr, IID_ITOVXmlWriter, made.Out()), TOV_OK);
-        return made;
-    }();
+    TOVPtr<ITOVXmlWriter> writer = NewComponent<ITOVXmlWriter>(host.Get(), CompID_TOVXmlWriter, IID_ITOVXmlWriter);
 };
 
 TEST_F(HostXmlWriter, ElementsNestByTheTagOfTheirParent) {

@@ -18,10 +18,16 @@ inline TOVPtr<ITOVString> Str(const std::string& utf8) {
 
 inline std::string Utf8(ITOVString* s) { return HostText::Read(s); }
 
+/// A new component `compId` of `host`, asked for `iid`.
+template <class I>
+TOVPtr<I> NewComponent(TOVHost* host, const _tovUID& compId, const _tovUID& iid) {
+    TOVPtr<I> made;
+    EXPECT_EQ(host->CreateComponent(compId, nullptr, iid, made.Out()), TOV_OK);
+    return made;
+}
+
 inline TOVPtr<UTIL::ITOVXmlParser> NewDomReader(TOVHost* host) {
-    TOVPtr<UTIL::ITOVXmlParser> parser;
-    EXPECT_EQ(host->CreateComponent(UTIL::CompID_TOVXmlReader, nullptr, UTIL::IID_ITOVXmlParser, parser.Out()), TOV_OK);
-    return parser;
+    return NewComponent<UTIL::ITOVXmlParser>(host, UTIL::CompID_TOVXmlReader, UTIL::IID_ITOVXmlParser);
 }
 
 /// The root element `parser` read, or an empty pointer.
@@ -40,16 +46,18 @@ std::string LastError(Parser* parser) {
     return Utf8(error.Get());
 }
 
-inline std::string NameOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node) {
+/// The text that `get` of `node` hands out.
+inline std::string TextOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node,
+                          TOVRESULT (UTIL::ITOVXmlDomNode::*get)(ITOVString**)) {
     TOVPtr<ITOVString> s;
-    EXPECT_EQ(node->GetName(s.OutT()), TOV_OK);
+    EXPECT_EQ((node.Get()->*get)(s.OutT()), TOV_OK);
     return Utf8(s.Get());
 }
-
+inline std::string NameOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node) {
+    return TextOf(node, &UTIL::ITOVXmlDomNode::GetName);
+}
 inline std::string ValueOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node) {
-    TOVPtr<ITOVString> s;
-    EXPECT_EQ(node->GetValue(s.OutT()), TOV_OK);
-    return Utf8(s.Get());
+    return TextOf(node, &UTIL::ITOVXmlDomNode::GetValue);
 }
 
 inline TOVPtr<UTIL::ITOVXmlDomNode> ChildOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node, uint32_t index) {
