@@ -79,16 +79,12 @@ TEST_F(HostXmlDom, AttributesComeAsAListOfAttributeViews) {
     EXPECT_EQ(item->GetNodeType(), kTOVXmlAttribute);
     TOVPtr<ITOVXmlDomAttribute> attribute;
     ASSERT_EQ(item->QueryInterface(IID_ITOVXmlDomAttribute, attribute.Out()), TOV_OK);
-    TOVPtr<ITOVString> name, value, tag;
-    ASSERT_EQ(attribute->GetAttributeName(name.OutT()), TOV_OK);
-    ASSERT_EQ(attribute->GetAttributeValue(value.OutT()), TOV_OK);
-    EXPECT_EQ(Utf8(name.Get()), "name");
-    EXPECT_EQ(Utf8(value.Get()), "Boom & mix");
+    EXPECT_EQ(TextOf(attribute.Get(), &ITOVXmlDomAttribute::GetAttributeName), "name");
+    EXPECT_EQ(TextOf(attribute.Get(), &ITOVXmlDomAttribute::GetAttributeValue), "Boom & mix");
 
     TOVPtr<ITOVXmlDomElement> element;
     ASSERT_EQ(root->QueryInterface(IID_ITOVXmlDomElement, element.Out()), TOV_OK);
-    ASSERT_EQ(element->GetTagName(tag.OutT()), TOV_OK);
-    EXPECT_EQ(Utf8(tag.Get()), "TRACK");
+    EXPECT_EQ(TextOf(element.Get(), &ITOVXmlDomElement::GetTagName), "TRACK");
     EXPECT_EQ(root->QueryInterface(IID_ITOVXmlDomAttribute, attribute.Out()), TOV_E_NOINTERFACE);
 }
 
@@ -142,9 +138,7 @@ TEST_F(HostXmlWriter, ElementsNestByTheTagOfTheirParent) {
         ASSERT_EQ(writer->WriteAttribute(Str("name").Get(), Str(name).Get(), Str("TRACK").Get()), TOV_OK);
         ASSERT_EQ(writer->WriteText(Str(name).Get(), Str("TRACK").Get()), TOV_OK);
     }
-    TOVPtr<ITOVString> text;
-    ASSERT_EQ(writer->GetText(text.OutT()), TOV_OK);
-    const std::string xml = Utf8(text.Get());
+    const std::string xml = TextOf(writer.Get(), &ITOVXmlWriter::GetText);
     EXPECT_EQ(xml,
               "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
               "<BWFXML>\n"

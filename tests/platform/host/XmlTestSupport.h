@@ -38,26 +38,25 @@ inline TOVPtr<UTIL::ITOVXmlDomNode> RootOf(UTIL::ITOVXmlParser* parser) {
     return node;
 }
 
+/// The text that `get` of `object` hands out.
+template <class Object>
+std::string TextOf(Object* object, TOVRESULT (Object::*get)(ITOVString**)) {
+    TOVPtr<ITOVString> s;
+    EXPECT_EQ((object->*get)(s.OutT()), TOV_OK);
+    return Utf8(s.Get());
+}
+
 /// Why the last parse of a DOM or SAX reader failed.
 template <class Parser>
 std::string LastError(Parser* parser) {
-    TOVPtr<ITOVString> error;
-    EXPECT_EQ(parser->GetLastError(error.OutT()), TOV_OK);
-    return Utf8(error.Get());
+    return TextOf(parser, &Parser::GetLastError);
 }
 
-/// The text that `get` of `node` hands out.
-inline std::string TextOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node,
-                          TOVRESULT (UTIL::ITOVXmlDomNode::*get)(ITOVString**)) {
-    TOVPtr<ITOVString> s;
-    EXPECT_EQ((node.Get()->*get)(s.OutT()), TOV_OK);
-    return Utf8(s.Get());
-}
 inline std::string NameOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node) {
-    return TextOf(node, &UTIL::ITOVXmlDomNode::GetName);
+    return TextOf(node.Get(), &UTIL::ITOVXmlDomNode::GetName);
 }
 inline std::string ValueOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node) {
-    return TextOf(node, &UTIL::ITOVXmlDomNode::GetValue);
+    return TextOf(node.Get(), &UTIL::ITOVXmlDomNode::GetValue);
 }
 
 inline TOVPtr<UTIL::ITOVXmlDomNode> ChildOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node, uint32_t index) {
