@@ -79,8 +79,8 @@ TEST_F(AAFDescriptorExtensions, ContainerGUIDsAreSeparateAndTheLastValueStands) 
 TEST_F(AAFDescriptorExtensions, InsertSequenceWrapsOnceAndKeepsTheSegment) {
     auto mob = f.Create<IAAFMob>(kAAFClassID_SourceMob);
     Query<IAAFSourceMob>(mob.get())->Initialize();
-    auto sound = f.DataDef(kAAFDataDef_Sound);
-    ASSERT_EQ(Query<IAAFSourceMob>(mob.get())->AddNilReference(2, 100, sound.get(), {25, 1}), AAFRESULT_SUCCESS);
+    ASSERT_EQ(Query<IAAFSourceMob>(mob.get())->AddNilReference(2, 100, f.DataDef(kAAFDataDef_Sound).get(), {25, 1}),
+              AAFRESULT_SUCCESS);
     Ptr<IAAFMobSlot> slot;
     ASSERT_EQ(mob->LookupSlot(2, slot.out()), AAFRESULT_SUCCESS);
     Ptr<IAAFSegment> clip;
@@ -104,8 +104,7 @@ TEST_F(AAFDescriptorExtensions, InsertSequenceWrapsOnceAndKeepsTheSegment) {
 }
 
 TEST_F(AAFDescriptorExtensions, ClassIDOfObjectsButNotOfTheDictionary) {
-    auto mob = f.Create<IAAFObject>(kAAFClassID_MasterMob);
-    EXPECT_EQ(GetAAFClassID(mob.get()), kAAFClassID_MasterMob);
+    EXPECT_EQ(GetAAFClassID(f.Create<IAAFObject>(kAAFClassID_MasterMob).get()), kAAFClassID_MasterMob);
     auto dictionaryObject = Query<IAAFObject>(f.dictionary.get());
     ASSERT_TRUE(dictionaryObject);
     int thrown = 0;

@@ -44,18 +44,15 @@ TEST_F(AAFHeader, AddMobRefusesDuplicateIdsSecondPlacementAndUninitialisedMobs) 
     aafNumSlots_t mobs = 99;
     EXPECT_EQ(f.header->CountMobs(kAAFAllMob, &mobs), AAFRESULT_SUCCESS);
     EXPECT_EQ(mobs, 0u);
-    auto a = NewMasterMob(1);
-    auto b = NewMasterMob(1);
     auto c = NewMasterMob(2);
-    EXPECT_EQ(f.header->AddMob(a.get()), AAFRESULT_SUCCESS);
-    EXPECT_EQ(f.header->AddMob(b.get()), AAFRESULT_DUPLICATE_MOBID);
+    EXPECT_EQ(f.header->AddMob(NewMasterMob(1).get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(f.header->AddMob(NewMasterMob(1).get()), AAFRESULT_DUPLICATE_MOBID);
     EXPECT_EQ(f.header->AddMob(c.get()), AAFRESULT_SUCCESS);
     EXPECT_EQ(f.header->AddMob(c.get()), AAFRESULT_DUPLICATE_MOBID);
     Ptr<IAAFMob> found;
     EXPECT_EQ(f.header->LookupMob(MobID(2), found.out()), AAFRESULT_SUCCESS);
     EXPECT_EQ(f.header->LookupMob(MobID(3), found.out()), AAFRESULT_MOB_NOT_FOUND);
-    auto uninitialised = f.Create<IAAFMob>(kAAFClassID_SourceMob);
-    EXPECT_EQ(f.header->AddMob(uninitialised.get()), AAFRESULT_NOT_INITIALIZED);
+    EXPECT_EQ(f.header->AddMob(f.Create<IAAFMob>(kAAFClassID_SourceMob).get()), AAFRESULT_NOT_INITIALIZED);
 }
 
 TEST_F(AAFObject, InitializeTwiceFails) {
@@ -131,8 +128,7 @@ TEST_F(AAFMob, NewPhysSourceRefMakesTheMissingSlotAndReplacesAClip) {
         Ptr<IUnknown> face;
         EXPECT_EQ(clip->QueryInterface(*iid, face.outVoid()), AAFRESULT_SUCCESS);
     }
-    Ptr<IUnknown> none;
-    EXPECT_EQ(clip->QueryInterface(IID_IAAFSequence, none.outVoid()), AAF_E_NOINTERFACE);
+    EXPECT_EQ(clip->QueryInterface(IID_IAAFSequence, Ptr<IUnknown>().outVoid()), AAF_E_NOINTERFACE);
 }
 
 TEST_F(AAFMob, CommentsAreRemovedOnceAndReadIntoBuffersLargeEnough) {
@@ -157,8 +153,7 @@ TEST_F(AAFMob, CommentsAreRemovedOnceAndReadIntoBuffersLargeEnough) {
 TEST_F(AAFMob, ASegmentSitsInOneSlotOnly) {
     auto mob = NewMasterMob(1);
     auto filler = f.Create<IAAFFiller>(kAAFClassID_Filler);
-    auto sound = f.DataDef(kAAFDataDef_Sound);
-    filler->Initialize(sound.get(), 10);
+    filler->Initialize(f.DataDef(kAAFDataDef_Sound).get(), 10);
     auto segment = Query<IAAFSegment>(filler.get());
     EXPECT_EQ(mob->AppendNewTimelineSlot({25, 1}, segment.get(), 1, L"A1", 0, nullptr), AAFRESULT_SUCCESS);
     EXPECT_EQ(mob->AppendNewTimelineSlot({25, 1}, segment.get(), 2, L"A2", 0, nullptr),
@@ -198,7 +193,6 @@ TEST_F(AAFMob, AddMasterSlotRefusesMisuseAndAddsNothing) {
 TEST_F(AAFSequence, LengthFollowsItsComponentsAndOtherDataIsRefused) {
     auto sequence = f.Create<IAAFSequence>(kAAFClassID_Sequence);
     auto timecodeDef = f.DataDef(kAAFDataDef_Timecode);
-    auto sound = f.DataDef(kAAFDataDef_Sound);
     sequence->Initialize(timecodeDef.get());
     auto tc = f.Create<IAAFTimecode>(kAAFClassID_Timecode);
     aafTimecode_t value{0, 1, 25};
@@ -211,10 +205,9 @@ TEST_F(AAFSequence, LengthFollowsItsComponentsAndOtherDataIsRefused) {
     Query<IAAFComponent>(sequence.get())->GetLength(&length);
     EXPECT_EQ(length, 120);
     auto soundFiller = f.Create<IAAFFiller>(kAAFClassID_Filler);
-    soundFiller->Initialize(sound.get(), 1);
+    soundFiller->Initialize(f.DataDef(kAAFDataDef_Sound).get(), 1);
     EXPECT_EQ(sequence->AppendComponent(Query<IAAFComponent>(soundFiller.get()).get()), AAFRESULT_INVALID_DATADEF);
-    Ptr<IAAFComponent> at;
-    EXPECT_EQ(sequence->GetComponentAt(2, at.out()), AAFRESULT_BADINDEX);
+    EXPECT_EQ(sequence->GetComponentAt(2, Ptr<IAAFComponent>().out()), AAFRESULT_BADINDEX);
 }
 
 TEST_F(AAFObject, DynamicOptionalPropertiesAreAbsentUntilSetAndTypeChecked) {
@@ -278,17 +271,15 @@ TEST_F(AAFTaggedValue, BytesOfAnySizeIncludingNone) {
 
 TEST_F(AAFClassDef, PictureDescriptorsComeFromACallersConcreteClass) {
     const aafUID_t pictureId = {0x7E57C1A5, 1, 2, {3, 4, 5, 6, 7, 8, 9, 10}};
-    Ptr<IAAFDigitalImageDescriptor> abstract;
     EXPECT_EQ(f.dictionary->CreateInstance(kAAFClassID_DigitalImageDescriptor, IID_IAAFDigitalImageDescriptor,
-                                           abstract.outUnknown()),
+                                           Ptr<IAAFDigitalImageDescriptor>().outUnknown()),
               AAFRESULT_INVALID_PARAM);
 
     Ptr<IAAFClassDef> parent, cls;
     ASSERT_EQ(f.dictionary->LookupClassDef(kAAFClassID_DigitalImageDescriptor, parent.out()), AAFRESULT_SUCCESS);
     ASSERT_EQ(f.dictionary->CreateMetaInstance(kAAFClassID_ClassDefinition, IID_IAAFClassDef, cls.outUnknown()),
               AAFRESULT_SUCCESS);
-    Ptr<IUnknown> early;
-    EXPECT_EQ(cls->CreateInstance(IID_IUnknown, early.out()), AAFRESULT_NOT_INITIALIZED);
+    EXPECT_EQ(cls->CreateInstance(IID_IUnknown, Ptr<IUnknown>().out()), AAFRESULT_NOT_INITIALIZED);
     EXPECT_EQ(f.dictionary->RegisterClassDef(cls.get()), AAFRESULT_NOT_INITIALIZED);
     ASSERT_EQ(cls->Initialize(pictureId, parent.get(), L"Picture", kAAFTrue), AAFRESULT_SUCCESS);
     EXPECT_EQ(cls->Initialize(pictureId, parent.get(), L"Picture", kAAFTrue), AAFRESULT_ALREADY_INITIALIZED);
