@@ -116,13 +116,10 @@ TEST_F(AAFDescriptorExtensions, ClassIDOfObjectsButNotOfTheDictionary) {
     EXPECT_EQ(thrown, static_cast<int>(TOV_E_UNEXPECTED));
 }
 
-bool SameRational(const _aafRational_t& a, const _aafRational_t& b) {
-    return a.numerator == b.numerator && a.denominator == b.denominator;
-}
-
-bool SameBox(const aafBoundsBox_t& a, const aafBoundsBox_t& b) {
-    return SameRational(a.PositionX, b.PositionX) && SameRational(a.PositionY, b.PositionY) &&
-           SameRational(a.Width, b.Width) && SameRational(a.Height, b.Height);
+// Member by member: rationals and boxes are whole 32-bit numbers without padding.
+template <class T>
+bool Same(const T& a, const T& b) {
+    return std::memcmp(&a, &b, sizeof a) == 0;
 }
 
 TEST_F(AAFDescriptorExtensions, BoxesAreSetOnAPictureAndTheirTypeRegisteredOnce) {
@@ -143,9 +140,9 @@ TEST_F(AAFDescriptorExtensions, BoxesAreSetOnAPictureAndTheirTypeRegisteredOnce)
         const aafBoundsBox_t& expected;
     } boxes[] = {{kAAFPropID_EssenceBox, essence}, {kAAFPropID_SourceBox, source}, {kAAFPropID_ValidBox, valid}};
     for (const auto& box : boxes)
-        EXPECT_TRUE(SameBox(ReadRecord<aafBoundsBox_t>(picture.get(), kAAFClassID_DigitalImageDescriptor, box.property,
-                                                       kAAFTypeID_OrrinBoundsBox),
-                            box.expected));
+        EXPECT_TRUE(Same(ReadRecord<aafBoundsBox_t>(picture.get(), kAAFClassID_DigitalImageDescriptor, box.property,
+                                                    kAAFTypeID_OrrinBoundsBox),
+                         box.expected));
     Ptr<IAAFTypeDef> type;
     ASSERT_EQ(f.dictionary->LookupTypeDef(kAAFTypeID_OrrinBoundsBox, type.out()), AAFRESULT_SUCCESS);
     aafCharacter name[16];
@@ -182,10 +179,10 @@ TEST_F(AAFDescriptorExtensions, ImageRotationLastValueStands) {
     ASSERT_TRUE(picture);
     for (const aafRational_t rotation : {aafRational_t{90, 1}, aafRational_t{-1, 2}}) {
         ASSERT_EQ(SetImageRotation(f.dictionary.get(), picture.get(), rotation), TOV_OK);
-        EXPECT_TRUE(SameRational(
-            ReadRecord<aafRational_t>(picture.get(), kAAFClassID_DigitalImageDescriptor,
-                                      kAAFPropID_DigitalImageDescriptor_ImageRotation, kAAFTypeID_Rational),
-            rotation));
+        EXPECT_TRUE(
+            Same(ReadRecord<aafRational_t>(picture.get(), kAAFClassID_DigitalImageDescriptor,
+                                           kAAFPropID_DigitalImageDescriptor_ImageRotation, kAAFTypeID_Rational),
+                 rotation));
     }
     EXPECT_EQ(SetImageRotation(f.dictionary.get(), nullptr, {90, 1}), TOV_E_POINTER);
 }

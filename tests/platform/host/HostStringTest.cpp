@@ -28,16 +28,10 @@ TOVRESULT InForm(int form, std::u32string_view text, Op op) {
     const std::vector<unsigned short> utf16 = UnicodeCodec::EncodeUTF16(text);
     const std::vector<unsigned int> utf32 = UnicodeCodec::EncodeUTF32(text);
     const std::wstring wide(text.begin(), text.end());
-    switch (form) {
-        case 0:
-            return op(Bytes(utf8.c_str()), static_cast<unsigned int>(utf8.size()));
-        case 1:
-            return op(utf16.data(), static_cast<unsigned int>(utf16.size()));
-        case 2:
-            return op(utf32.data(), static_cast<unsigned int>(utf32.size()));
-        default:
-            return op(wide.c_str(), static_cast<unsigned int>(wide.size()));
-    }
+    if (form == 0) return op(Bytes(utf8.c_str()), static_cast<unsigned int>(utf8.size()));
+    if (form == 1) return op(utf16.data(), static_cast<unsigned int>(utf16.size()));
+    if (form == 2) return op(utf32.data(), static_cast<unsigned int>(utf32.size()));
+    return op(wide.c_str(), static_cast<unsigned int>(wide.size()));
 }
 
 TOVPtr<ITOVString> NewString(_tovUnicodeType type, std::u32string_view text) {

@@ -39,8 +39,7 @@ public:
     TOVRESULT Error(ITOVString* message) override { return Own("error", message); }
     TOVRESULT FatalError(ITOVString* message) override { return Own("fatal", message); }
 
-    std::vector<std::string> events;
-    std::vector<std::string> errors;
+    std::vector<std::string> events, errors;
     std::string failAt;
     uint32_t refs = 1;
 
