@@ -104,11 +104,8 @@ TEST_F(HostXmlDom, TextIsUnicodeAndAFileIsReadInItsDeclaredEncoding) {
 }
 
 TEST_F(HostXmlDom, NodesOutliveTheirParser) {
-    TOVPtr<ITOVXmlDomNode> scene;
-    {
-        TOVPtr<ITOVXmlDomNode> root = Root("<BWFXML><SCENE>7</SCENE></BWFXML>");
-        scene = ChildOf(root, 0);
-    }
+    // The parser and the root are gone at the end of this line.
+    const TOVPtr<ITOVXmlDomNode> scene = ChildOf(Root("<BWFXML><SCENE>7</SCENE></BWFXML>"), 0);
     EXPECT_EQ(ValueOf(ChildOf(scene, 0)), "7");
 }
 
