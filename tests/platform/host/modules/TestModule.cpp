@@ -33,24 +33,17 @@ public:
 // Held from start-up to shutdown, as a real module holds the host's services.
 TOVPtr<ITOVConsole> s_console;
 
-// A new component `compId` of `host`, through the host's factory; throws a failure.
-template <class I>
-TOVPtr<I> NewComponent(ITOVUnknown* host, const _tovUID& compId, const _tovUID& iid) {
-    TOVPtr<ITOVComponentFactory> factory;
-    TOVCheck(host->QueryInterface(IID_ITOVComponentFactory, factory.Out()));
-    TOVPtr<I> made;
-    TOVCheck(factory->CreateComponent(compId, nullptr, iid, made.Out()));
-    return made;
-}
-
 }  // namespace
 
 TOV_EXPORT TOVRESULT TOVRegisterPlugin(ITOVUnknown* host, ITOVPluginDefinition** out) {
     return TOVGuarded([&] {
         if (!host || !out) return TOV_E_POINTER;
         *out = nullptr;
-        auto definition =
-            NewComponent<ITOVPluginDefinition>(host, TOVCompID_PluginDefinition, IID_ITOVPluginDefinition);
+        TOVPtr<ITOVComponentFactory> factory;
+        TOVCheck(host->QueryInterface(IID_ITOVComponentFactory, factory.Out()));
+        TOVPtr<ITOVPluginDefinition> definition;
+        TOVCheck(
+            factory->CreateComponent(TOVCompID_PluginDefinition, nullptr, IID_ITOVPluginDefinition, definition.Out()));
         TOVCheck(
             definition->Initialize(TestModulePluginID, 2, 3, L"Test Module", TestModuleVendorID, L"Test Vendor", 1, 1));
         *out = definition.Detach();
@@ -63,8 +56,11 @@ TOV_EXPORT TOVRESULT TOVRegisterComponent(ITOVUnknown* host, unsigned int index,
         if (!host || !out) return TOV_E_POINTER;
         if (index > 0) return TOV_E_INVALIDARG;
         *out = nullptr;
-        auto definition =
-            NewComponent<ITOVComponentDefinition>(host, TOVCompID_ComponentDefinition, IID_ITOVComponentDefinition);
+        TOVPtr<ITOVComponentFactory> factory;
+        TOVCheck(host->QueryInterface(IID_ITOVComponentFactory, factory.Out()));
+        TOVPtr<ITOVComponentDefinition> definition;
+        TOVCheck(factory->CreateComponent(TOVCompID_ComponentDefinition, nullptr, IID_ITOVComponentDefinition,
+                                          definition.Out()));
         TOVCheck(
             definition->Initialize(CompID_TestEcho, TOVCompType_OrrinMediaAccess, 2, 3, CLSID_TestEcho, L"TestEcho"));
         *out = definition.Detach();
