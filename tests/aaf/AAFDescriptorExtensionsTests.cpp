@@ -14,6 +14,14 @@ namespace {
 constexpr _tovUID kFirst = {0x11111111, 0x2222, 0x3333, {1, 2, 3, 4, 5, 6, 7, 8}};
 constexpr _tovUID kSecond = {0x99999999, 0x8888, 0x7777, {8, 7, 6, 5, 4, 3, 2, 1}};
 
+// The one value that `get` of `object` reads.
+template <class T, class O>
+T Read(O* object, AAFRESULT (O::*get)(T*)) {
+    T value{};
+    EXPECT_EQ((object->*get)(&value), AAFRESULT_SUCCESS);
+    return value;
+}
+
 class AAFDescriptorExtensions : public ::testing::Test {
 protected:
     TransientFile f{&AAFFileOpenTransient};
@@ -67,9 +75,8 @@ TEST_F(AAFDescriptorExtensions, ContainerGUIDsAreSeparateAndTheLastValueStands) 
     EXPECT_EQ(SetContainerHandlerGUID(f.dictionary.get(), pcm.get(), kFirst), TOV_OK);
     EXPECT_EQ(ReadUID(pcm.get(), kAAFClassID_EssenceDescriptor, kAAFPropID_MediaContainerGUID), AsAAF(kSecond));
     EXPECT_EQ(ReadUID(pcm.get(), kAAFClassID_EssenceDescriptor, kAAFPropID_ContainerHandlerGUID), AsAAF(kFirst));
-    aafUInt32 count = 0;
-    Query<IAAFObject>(pcm.get())->CountProperties(&count);
-    EXPECT_EQ(count, 2u);  // the two dynamic ones: the descriptor was never initialised
+    // The two dynamic ones: the descriptor was never initialised.
+    EXPECT_EQ(Read(Query<IAAFObject>(pcm.get()).get(), &IAAFObject::CountProperties), 2u);
     // The access kind's value is pinned by the golden dumps; here its refusals.
     auto file = Query<IAAFFileDescriptor>(pcm.get());
     EXPECT_EQ(SetMediaAccessKind(nullptr, file.get(), 3), TOV_E_POINTER);
@@ -91,15 +98,11 @@ TEST_F(AAFDescriptorExtensions, InsertSequenceWrapsOnceAndKeepsTheSegment) {
         slot->GetSegment(segment.out());
         auto sequence = Query<IAAFSequence>(segment.get());
         ASSERT_TRUE(sequence);
-        aafUInt32 count = 0;
-        sequence->CountComponents(&count);
-        EXPECT_EQ(count, 1u);
+        EXPECT_EQ(Read(sequence.get(), &IAAFSequence::CountComponents), 1u);
         Ptr<IAAFComponent> first;
         sequence->GetComponentAt(0, first.out());
         EXPECT_EQ(Query<IUnknown>(first.get()).get(), Query<IUnknown>(clip.get()).get());
-        aafLength_t length = 0;
-        Query<IAAFComponent>(segment.get())->GetLength(&length);
-        EXPECT_EQ(length, 100);
+        EXPECT_EQ(Read(Query<IAAFComponent>(segment.get()).get(), &IAAFComponent::GetLength), 100);
     }
 }
 
@@ -125,16 +128,14 @@ bool Same(const T& a, const T& b) {
 TEST_F(AAFDescriptorExtensions, BoxesAreSetOnAPictureAndTheirTypeRegisteredOnce) {
     auto picture = NewPicture();
     ASSERT_TRUE(picture);
-    aafUInt32 before = 0, after = 0;
-    f.dictionary->CountTypeDefs(&before);
+    const aafUInt32 before = Read(f.dictionary.get(), &IAAFDictionary::CountTypeDefs);
     aafBoundsBox_t essence = ToAAFBox({0, 1}, {0, 1}, {1920, 1}, {1080, 1});
     aafBoundsBox_t source = ToAAFBox({-40, 1}, {-10, 1}, {2000, 1}, {1100, 1});
     aafBoundsBox_t valid = ToAAFBox({19, 2}, {0, 1}, {1901, 1}, {1080, 1});
     // The second call finds the type and the properties, and its values stand.
     EXPECT_EQ(PutBoxesToAAF(f.dictionary.get(), picture.get(), valid, valid, valid), TOV_OK);
     EXPECT_EQ(PutBoxesToAAF(f.dictionary.get(), picture.get(), essence, source, valid), TOV_OK);
-    f.dictionary->CountTypeDefs(&after);
-    EXPECT_EQ(after, before + 1);
+    EXPECT_EQ(Read(f.dictionary.get(), &IAAFDictionary::CountTypeDefs), before + 1);
     const struct {
         aafUID_t property;
         const aafBoundsBox_t& expected;

@@ -18,6 +18,14 @@ aafMobID_t MobID(aafUInt8 last) {
     return id;
 }
 
+// The one value that `get` of `object` reads.
+template <class T, class O>
+T Read(O* object, AAFRESULT (O::*get)(T*)) {
+    T value{};
+    EXPECT_EQ((object->*get)(&value), AAFRESULT_SUCCESS);
+    return value;
+}
+
 class AAFFixture : public ::testing::Test {
 protected:
     TransientFile f{&AAFFileOpenTransient};
@@ -107,9 +115,7 @@ TEST_F(AAFMob, NewPhysSourceRefMakesTheMissingSlotAndReplacesAClip) {
     ASSERT_EQ(master->NewPhysSourceRef({48000, 1}, 3, sound.get(), ref, 480), AAFRESULT_SUCCESS);
     ref.sourceSlotID = 4;
     ASSERT_EQ(master->NewPhysSourceRef({48000, 1}, 3, sound.get(), ref, 960), AAFRESULT_SUCCESS);
-    aafNumSlots_t slots = 0;
-    mob->CountSlots(&slots);
-    EXPECT_EQ(slots, 1u);
+    EXPECT_EQ(Read(mob.get(), &IAAFMob::CountSlots), 1u);
     Ptr<IAAFMobSlot> slot;
     ASSERT_EQ(mob->LookupSlot(3, slot.out()), AAFRESULT_SUCCESS);
     Ptr<IAAFSegment> segment;
@@ -119,9 +125,7 @@ TEST_F(AAFMob, NewPhysSourceRefMakesTheMissingSlotAndReplacesAClip) {
     aafSourceRef_t got{};
     ASSERT_EQ(clip->GetSourceReference(&got), AAFRESULT_SUCCESS);
     EXPECT_EQ(got.sourceSlotID, 4u);
-    aafLength_t length = 0;
-    Query<IAAFComponent>(segment.get())->GetLength(&length);
-    EXPECT_EQ(length, 960);
+    EXPECT_EQ(Read(Query<IAAFComponent>(segment.get()).get(), &IAAFComponent::GetLength), 960);
     // One object answers every interface of its class and its parents, and no other.
     for (const aafUID_t* iid : {&IID_IAAFSourceReference, &IID_IAAFSourceReference2, &IID_IAAFSegment,
                                 &IID_IAAFComponent, &IID_IAAFComponent2, &IID_IAAFObject, &IID_IUnknown}) {
@@ -185,9 +189,7 @@ TEST_F(AAFMob, AddMasterSlotRefusesMisuseAndAddsNothing) {
                   m.result)
             << m.why;
     }
-    aafNumSlots_t count = 9;
-    master->CountSlots(&count);
-    EXPECT_EQ(count, 0u);
+    EXPECT_EQ(Read(master.get(), &IAAFMob::CountSlots), 0u);
 }
 
 TEST_F(AAFSequence, LengthFollowsItsComponentsAndOtherDataIsRefused) {
@@ -201,9 +203,7 @@ TEST_F(AAFSequence, LengthFollowsItsComponentsAndOtherDataIsRefused) {
     auto filler = f.Create<IAAFFiller>(kAAFClassID_Filler);
     filler->Initialize(timecodeDef.get(), 20);
     ASSERT_EQ(sequence->PrependComponent(Query<IAAFComponent>(filler.get()).get()), AAFRESULT_SUCCESS);
-    aafLength_t length = 0;
-    Query<IAAFComponent>(sequence.get())->GetLength(&length);
-    EXPECT_EQ(length, 120);
+    EXPECT_EQ(Read(Query<IAAFComponent>(sequence.get()).get(), &IAAFComponent::GetLength), 120);
     auto soundFiller = f.Create<IAAFFiller>(kAAFClassID_Filler);
     soundFiller->Initialize(f.DataDef(kAAFDataDef_Sound).get(), 1);
     EXPECT_EQ(sequence->AppendComponent(Query<IAAFComponent>(soundFiller.get()).get()), AAFRESULT_INVALID_DATADEF);
