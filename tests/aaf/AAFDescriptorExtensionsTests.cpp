@@ -14,6 +14,14 @@ namespace {
 constexpr _tovUID kFirst = {0x11111111, 0x2222, 0x3333, {1, 2, 3, 4, 5, 6, 7, 8}};
 constexpr _tovUID kSecond = {0x99999999, 0x8888, 0x7777, {8, 7, 6, 5, 4, 3, 2, 1}};
 
+// The one value that `get` of `object` reads.
+template <class T, class O>
+T Read(O* object, AAFRESULT (O::*get)(T*)) {
+    T value{};
+    EXPECT_EQ((object->*get)(&value), AAFRESULT_SUCCESS);
+    return value;
+}
+
 class AAFDescriptorExtensions : public ::testing::Test {
 protected:
     TransientFile f{&AAFFileOpenTransient};
@@ -67,9 +75,8 @@ TEST_F(AAFDescriptorExtensions, ContainerGUIDsAreSeparateAndTheLastValueStands) 
     EXPECT_EQ(SetContainerHandlerGUID(f.dictionary.get(), pcm.get(), kFirst), TOV_OK);
     EXPECT_EQ(ReadUID(pcm.get(), kAAFClassID_EssenceDescriptor, kAAFPropID_MediaContainerGUID), AsAAF(kSecond));
     EXPECT_EQ(ReadUID(pcm.get(), kAAFClassID_EssenceDescriptor, kAAFPropID_ContainerHandlerGUID), AsAAF(kFirst));
-    aafUInt32 count = 0;
-    Query<IAAFObject>(pcm.get())->CountProperties(&count);
-    EXPECT_EQ(count, 2u);  // the two dynamic ones: the descriptor was never initialised
+    // The two dynamic ones: the descriptor was never initialised.
+    EXPECT_EQ(Read(Query<IAAFObject>(pcm.get()).get(), &IAAFObject::CountProperties), 2u);
     // The access kind's value is pinned by the golden dumps; here its refusals.
     auto file = Query<IAAFFileDescriptor>(pcm.get());
     EXPECT_EQ(SetMediaAccessKind(nullptr, file.get(), 3), TOV_E_POINTER);
@@ -79,8 +86,8 @@ TEST_F(AAFDescriptorExtensions, ContainerGUIDsAreSeparateAndTheLastValueStands) 
 TEST_F(AAFDescriptorExtensions, InsertSequenceWrapsOnceAndKeepsTheSegment) {
     auto mob = f.Create<IAAFMob>(kAAFClassID_SourceMob);
     Query<IAAFSourceMob>(mob.get())->Initialize();
-    auto sound = f.DataDef(kAAFDataDef_Sound);
-    ASSERT_EQ(Query<IAAFSourceMob>(mob.get())->AddNilReference(2, 100, sound.get(), {25, 1}), AAFRESULT_SUCCESS);
+    ASSERT_EQ(Query<IAAFSourceMob>(mob.get())->AddNilReference(2, 100, f.DataDef(kAAFDataDef_Sound).get(), {25, 1}),
+              AAFRESULT_SUCCESS);
     Ptr<IAAFMobSlot> slot;
     ASSERT_EQ(mob->LookupSlot(2, slot.out()), AAFRESULT_SUCCESS);
     Ptr<IAAFSegment> clip;
@@ -91,21 +98,16 @@ TEST_F(AAFDescriptorExtensions, InsertSequenceWrapsOnceAndKeepsTheSegment) {
         slot->GetSegment(segment.out());
         auto sequence = Query<IAAFSequence>(segment.get());
         ASSERT_TRUE(sequence);
-        aafUInt32 count = 0;
-        sequence->CountComponents(&count);
-        EXPECT_EQ(count, 1u);
+        EXPECT_EQ(Read(sequence.get(), &IAAFSequence::CountComponents), 1u);
         Ptr<IAAFComponent> first;
         sequence->GetComponentAt(0, first.out());
         EXPECT_EQ(Query<IUnknown>(first.get()).get(), Query<IUnknown>(clip.get()).get());
-        aafLength_t length = 0;
-        Query<IAAFComponent>(segment.get())->GetLength(&length);
-        EXPECT_EQ(length, 100);
+        EXPECT_EQ(Read(Query<IAAFComponent>(segment.get()).get(), &IAAFComponent::GetLength), 100);
     }
 }
 
 TEST_F(AAFDescriptorExtensions, ClassIDOfObjectsButNotOfTheDictionary) {
-    auto mob = f.Create<IAAFObject>(kAAFClassID_MasterMob);
-    EXPECT_EQ(GetAAFClassID(mob.get()), kAAFClassID_MasterMob);
+    EXPECT_EQ(GetAAFClassID(f.Create<IAAFObject>(kAAFClassID_MasterMob).get()), kAAFClassID_MasterMob);
     auto dictionaryObject = Query<IAAFObject>(f.dictionary.get());
     ASSERT_TRUE(dictionaryObject);
     int thrown = 0;
@@ -117,36 +119,31 @@ TEST_F(AAFDescriptorExtensions, ClassIDOfObjectsButNotOfTheDictionary) {
     EXPECT_EQ(thrown, static_cast<int>(TOV_E_UNEXPECTED));
 }
 
-bool SameRational(const _aafRational_t& a, const _aafRational_t& b) {
-    return a.numerator == b.numerator && a.denominator == b.denominator;
-}
-
-bool SameBox(const aafBoundsBox_t& a, const aafBoundsBox_t& b) {
-    return SameRational(a.PositionX, b.PositionX) && SameRational(a.PositionY, b.PositionY) &&
-           SameRational(a.Width, b.Width) && SameRational(a.Height, b.Height);
+// Member by member: rationals and boxes are whole 32-bit numbers without padding.
+template <class T>
+bool Same(const T& a, const T& b) {
+    return std::memcmp(&a, &b, sizeof a) == 0;
 }
 
 TEST_F(AAFDescriptorExtensions, BoxesAreSetOnAPictureAndTheirTypeRegisteredOnce) {
     auto picture = NewPicture();
     ASSERT_TRUE(picture);
-    aafUInt32 before = 0, after = 0;
-    f.dictionary->CountTypeDefs(&before);
+    const aafUInt32 before = Read(f.dictionary.get(), &IAAFDictionary::CountTypeDefs);
     aafBoundsBox_t essence = ToAAFBox({0, 1}, {0, 1}, {1920, 1}, {1080, 1});
     aafBoundsBox_t source = ToAAFBox({-40, 1}, {-10, 1}, {2000, 1}, {1100, 1});
     aafBoundsBox_t valid = ToAAFBox({19, 2}, {0, 1}, {1901, 1}, {1080, 1});
     // The second call finds the type and the properties, and its values stand.
     EXPECT_EQ(PutBoxesToAAF(f.dictionary.get(), picture.get(), valid, valid, valid), TOV_OK);
     EXPECT_EQ(PutBoxesToAAF(f.dictionary.get(), picture.get(), essence, source, valid), TOV_OK);
-    f.dictionary->CountTypeDefs(&after);
-    EXPECT_EQ(after, before + 1);
+    EXPECT_EQ(Read(f.dictionary.get(), &IAAFDictionary::CountTypeDefs), before + 1);
     const struct {
         aafUID_t property;
         const aafBoundsBox_t& expected;
     } boxes[] = {{kAAFPropID_EssenceBox, essence}, {kAAFPropID_SourceBox, source}, {kAAFPropID_ValidBox, valid}};
     for (const auto& box : boxes)
-        EXPECT_TRUE(SameBox(ReadRecord<aafBoundsBox_t>(picture.get(), kAAFClassID_DigitalImageDescriptor, box.property,
-                                                       kAAFTypeID_OrrinBoundsBox),
-                            box.expected));
+        EXPECT_TRUE(Same(ReadRecord<aafBoundsBox_t>(picture.get(), kAAFClassID_DigitalImageDescriptor, box.property,
+                                                    kAAFTypeID_OrrinBoundsBox),
+                         box.expected));
     Ptr<IAAFTypeDef> type;
     ASSERT_EQ(f.dictionary->LookupTypeDef(kAAFTypeID_OrrinBoundsBox, type.out()), AAFRESULT_SUCCESS);
     aafCharacter name[16];
@@ -183,10 +180,10 @@ TEST_F(AAFDescriptorExtensions, ImageRotationLastValueStands) {
     ASSERT_TRUE(picture);
     for (const aafRational_t rotation : {aafRational_t{90, 1}, aafRational_t{-1, 2}}) {
         ASSERT_EQ(SetImageRotation(f.dictionary.get(), picture.get(), rotation), TOV_OK);
-        EXPECT_TRUE(SameRational(
-            ReadRecord<aafRational_t>(picture.get(), kAAFClassID_DigitalImageDescriptor,
-                                      kAAFPropID_DigitalImageDescriptor_ImageRotation, kAAFTypeID_Rational),
-            rotation));
+        EXPECT_TRUE(
+            Same(ReadRecord<aafRational_t>(picture.get(), kAAFClassID_DigitalImageDescriptor,
+                                           kAAFPropID_DigitalImageDescriptor_ImageRotation, kAAFTypeID_Rational),
+                 rotation));
     }
     EXPECT_EQ(SetImageRotation(f.dictionary.get(), nullptr, {90, 1}), TOV_E_POINTER);
 }

@@ -117,8 +117,7 @@ TEST_F(AAFLoader, AnExceptionFromTheLibraryBecomesAResult) {
 
 TEST(AAFLoaderPlatform, NullArguments) {
     EXPECT_EQ(AAFGetStaticLibraryVersion(nullptr), AAFRESULT_NULL_PARAM);
-    void* handle = nullptr;
-    void* symbol = nullptr;
+    void *handle = nullptr, *symbol = nullptr;
     EXPECT_EQ(AAFLoadLibrary(nullptr, &handle), AAFRESULT_NULL_PARAM);
     EXPECT_EQ(AAFLoadLibrary("x", nullptr), AAFRESULT_NULL_PARAM);
     EXPECT_EQ(AAFUnloadLibrary(nullptr), AAFRESULT_NULL_PARAM);

@@ -18,6 +18,14 @@ aafMobID_t MobID(aafUInt8 last) {
     return id;
 }
 
+// The one value that `get` of `object` reads.
+template <class T, class O>
+T Read(O* object, AAFRESULT (O::*get)(T*)) {
+    T value{};
+    EXPECT_EQ((object->*get)(&value), AAFRESULT_SUCCESS);
+    return value;
+}
+
 class AAFFixture : public ::testing::Test {
 protected:
     TransientFile f{&AAFFileOpenTransient};
@@ -44,18 +52,15 @@ TEST_F(AAFHeader, AddMobRefusesDuplicateIdsSecondPlacementAndUninitialisedMobs) 
     aafNumSlots_t mobs = 99;
     EXPECT_EQ(f.header->CountMobs(kAAFAllMob, &mobs), AAFRESULT_SUCCESS);
     EXPECT_EQ(mobs, 0u);
-    auto a = NewMasterMob(1);
-    auto b = NewMasterMob(1);
     auto c = NewMasterMob(2);
-    EXPECT_EQ(f.header->AddMob(a.get()), AAFRESULT_SUCCESS);
-    EXPECT_EQ(f.header->AddMob(b.get()), AAFRESULT_DUPLICATE_MOBID);
+    EXPECT_EQ(f.header->AddMob(NewMasterMob(1).get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(f.header->AddMob(NewMasterMob(1).get()), AAFRESULT_DUPLICATE_MOBID);
     EXPECT_EQ(f.header->AddMob(c.get()), AAFRESULT_SUCCESS);
     EXPECT_EQ(f.header->AddMob(c.get()), AAFRESULT_DUPLICATE_MOBID);
     Ptr<IAAFMob> found;
     EXPECT_EQ(f.header->LookupMob(MobID(2), found.out()), AAFRESULT_SUCCESS);
     EXPECT_EQ(f.header->LookupMob(MobID(3), found.out()), AAFRESULT_MOB_NOT_FOUND);
-    auto uninitialised = f.Create<IAAFMob>(kAAFClassID_SourceMob);
-    EXPECT_EQ(f.header->AddMob(uninitialised.get()), AAFRESULT_NOT_INITIALIZED);
+    EXPECT_EQ(f.header->AddMob(f.Create<IAAFMob>(kAAFClassID_SourceMob).get()), AAFRESULT_NOT_INITIALIZED);
 }
 
 TEST_F(AAFObject, InitializeTwiceFails) {
@@ -93,17 +98,13 @@ TEST_F(AAFInterfaces, NullArgumentsGiveNullParam) {
 }
 
 TEST_F(AAFDictionary, LookupsOfUnknownIdsFail) {
-    auto mob = NewMasterMob(1);
-    Ptr<IAAFMobSlot> slot;
-    EXPECT_EQ(mob->LookupSlot(7, slot.out()), AAFRESULT_SLOT_NOT_FOUND);
-    Ptr<IAAFClassDef> cls;
-    EXPECT_EQ(f.dictionary->LookupClassDef(kAAFPropID_Mob_Name, cls.out()), AAFRESULT_OBJECT_NOT_FOUND);
-    Ptr<IAAFTypeDef> type;
-    EXPECT_EQ(f.dictionary->LookupTypeDef(kAAFClassID_Mob, type.out()), AAFRESULT_OBJECT_NOT_FOUND);
-    Ptr<IAAFDataDef> def;
-    EXPECT_EQ(f.dictionary->LookupDataDef(kAAFClassID_Mob, def.out()), AAFRESULT_OBJECT_NOT_FOUND);
-    Ptr<IUnknown> abstract;
-    EXPECT_EQ(f.dictionary->CreateInstance(kAAFClassID_Mob, IID_IAAFMob, abstract.out()), AAFRESULT_INVALID_PARAM);
+    // Each result lands in a temporary pointer, which releases whatever it was given.
+    EXPECT_EQ(NewMasterMob(1)->LookupSlot(7, Ptr<IAAFMobSlot>().out()), AAFRESULT_SLOT_NOT_FOUND);
+    EXPECT_EQ(f.dictionary->LookupClassDef(kAAFPropID_Mob_Name, Ptr<IAAFClassDef>().out()), AAFRESULT_OBJECT_NOT_FOUND);
+    EXPECT_EQ(f.dictionary->LookupTypeDef(kAAFClassID_Mob, Ptr<IAAFTypeDef>().out()), AAFRESULT_OBJECT_NOT_FOUND);
+    EXPECT_EQ(f.dictionary->LookupDataDef(kAAFClassID_Mob, Ptr<IAAFDataDef>().out()), AAFRESULT_OBJECT_NOT_FOUND);
+    EXPECT_EQ(f.dictionary->CreateInstance(kAAFClassID_Mob, IID_IAAFMob, Ptr<IUnknown>().out()),
+              AAFRESULT_INVALID_PARAM);
 }
 
 TEST_F(AAFMob, NewPhysSourceRefMakesTheMissingSlotAndReplacesAClip) {
@@ -114,9 +115,7 @@ TEST_F(AAFMob, NewPhysSourceRefMakesTheMissingSlotAndReplacesAClip) {
     ASSERT_EQ(master->NewPhysSourceRef({48000, 1}, 3, sound.get(), ref, 480), AAFRESULT_SUCCESS);
     ref.sourceSlotID = 4;
     ASSERT_EQ(master->NewPhysSourceRef({48000, 1}, 3, sound.get(), ref, 960), AAFRESULT_SUCCESS);
-    aafNumSlots_t slots = 0;
-    mob->CountSlots(&slots);
-    EXPECT_EQ(slots, 1u);
+    EXPECT_EQ(Read(mob.get(), &IAAFMob::CountSlots), 1u);
     Ptr<IAAFMobSlot> slot;
     ASSERT_EQ(mob->LookupSlot(3, slot.out()), AAFRESULT_SUCCESS);
     Ptr<IAAFSegment> segment;
@@ -126,17 +125,14 @@ TEST_F(AAFMob, NewPhysSourceRefMakesTheMissingSlotAndReplacesAClip) {
     aafSourceRef_t got{};
     ASSERT_EQ(clip->GetSourceReference(&got), AAFRESULT_SUCCESS);
     EXPECT_EQ(got.sourceSlotID, 4u);
-    aafLength_t length = 0;
-    Query<IAAFComponent>(segment.get())->GetLength(&length);
-    EXPECT_EQ(length, 960);
+    EXPECT_EQ(Read(Query<IAAFComponent>(segment.get()).get(), &IAAFComponent::GetLength), 960);
     // One object answers every interface of its class and its parents, and no other.
     for (const aafUID_t* iid : {&IID_IAAFSourceReference, &IID_IAAFSourceReference2, &IID_IAAFSegment,
                                 &IID_IAAFComponent, &IID_IAAFComponent2, &IID_IAAFObject, &IID_IUnknown}) {
         Ptr<IUnknown> face;
         EXPECT_EQ(clip->QueryInterface(*iid, face.outVoid()), AAFRESULT_SUCCESS);
     }
-    Ptr<IUnknown> none;
-    EXPECT_EQ(clip->QueryInterface(IID_IAAFSequence, none.outVoid()), AAF_E_NOINTERFACE);
+    EXPECT_EQ(clip->QueryInterface(IID_IAAFSequence, Ptr<IUnknown>().outVoid()), AAF_E_NOINTERFACE);
 }
 
 TEST_F(AAFMob, CommentsAreRemovedOnceAndReadIntoBuffersLargeEnough) {
@@ -161,8 +157,7 @@ TEST_F(AAFMob, CommentsAreRemovedOnceAndReadIntoBuffersLargeEnough) {
 TEST_F(AAFMob, ASegmentSitsInOneSlotOnly) {
     auto mob = NewMasterMob(1);
     auto filler = f.Create<IAAFFiller>(kAAFClassID_Filler);
-    auto sound = f.DataDef(kAAFDataDef_Sound);
-    filler->Initialize(sound.get(), 10);
+    filler->Initialize(f.DataDef(kAAFDataDef_Sound).get(), 10);
     auto segment = Query<IAAFSegment>(filler.get());
     EXPECT_EQ(mob->AppendNewTimelineSlot({25, 1}, segment.get(), 1, L"A1", 0, nullptr), AAFRESULT_SUCCESS);
     EXPECT_EQ(mob->AppendNewTimelineSlot({25, 1}, segment.get(), 2, L"A2", 0, nullptr),
@@ -194,15 +189,12 @@ TEST_F(AAFMob, AddMasterSlotRefusesMisuseAndAddsNothing) {
                   m.result)
             << m.why;
     }
-    aafNumSlots_t count = 9;
-    master->CountSlots(&count);
-    EXPECT_EQ(count, 0u);
+    EXPECT_EQ(Read(master.get(), &IAAFMob::CountSlots), 0u);
 }
 
 TEST_F(AAFSequence, LengthFollowsItsComponentsAndOtherDataIsRefused) {
     auto sequence = f.Create<IAAFSequence>(kAAFClassID_Sequence);
     auto timecodeDef = f.DataDef(kAAFDataDef_Timecode);
-    auto sound = f.DataDef(kAAFDataDef_Sound);
     sequence->Initialize(timecodeDef.get());
     auto tc = f.Create<IAAFTimecode>(kAAFClassID_Timecode);
     aafTimecode_t value{0, 1, 25};
@@ -211,14 +203,11 @@ TEST_F(AAFSequence, LengthFollowsItsComponentsAndOtherDataIsRefused) {
     auto filler = f.Create<IAAFFiller>(kAAFClassID_Filler);
     filler->Initialize(timecodeDef.get(), 20);
     ASSERT_EQ(sequence->PrependComponent(Query<IAAFComponent>(filler.get()).get()), AAFRESULT_SUCCESS);
-    aafLength_t length = 0;
-    Query<IAAFComponent>(sequence.get())->GetLength(&length);
-    EXPECT_EQ(length, 120);
+    EXPECT_EQ(Read(Query<IAAFComponent>(sequence.get()).get(), &IAAFComponent::GetLength), 120);
     auto soundFiller = f.Create<IAAFFiller>(kAAFClassID_Filler);
-    soundFiller->Initialize(sound.get(), 1);
+    soundFiller->Initialize(f.DataDef(kAAFDataDef_Sound).get(), 1);
     EXPECT_EQ(sequence->AppendComponent(Query<IAAFComponent>(soundFiller.get()).get()), AAFRESULT_INVALID_DATADEF);
-    Ptr<IAAFComponent> at;
-    EXPECT_EQ(sequence->GetComponentAt(2, at.out()), AAFRESULT_BADINDEX);
+    EXPECT_EQ(sequence->GetComponentAt(2, Ptr<IAAFComponent>().out()), AAFRESULT_BADINDEX);
 }
 
 TEST_F(AAFObject, DynamicOptionalPropertiesAreAbsentUntilSetAndTypeChecked) {
@@ -282,17 +271,15 @@ TEST_F(AAFTaggedValue, BytesOfAnySizeIncludingNone) {
 
 TEST_F(AAFClassDef, PictureDescriptorsComeFromACallersConcreteClass) {
     const aafUID_t pictureId = {0x7E57C1A5, 1, 2, {3, 4, 5, 6, 7, 8, 9, 10}};
-    Ptr<IAAFDigitalImageDescriptor> abstract;
     EXPECT_EQ(f.dictionary->CreateInstance(kAAFClassID_DigitalImageDescriptor, IID_IAAFDigitalImageDescriptor,
-                                           abstract.outUnknown()),
+                                           Ptr<IAAFDigitalImageDescriptor>().outUnknown()),
               AAFRESULT_INVALID_PARAM);
 
     Ptr<IAAFClassDef> parent, cls;
     ASSERT_EQ(f.dictionary->LookupClassDef(kAAFClassID_DigitalImageDescriptor, parent.out()), AAFRESULT_SUCCESS);
     ASSERT_EQ(f.dictionary->CreateMetaInstance(kAAFClassID_ClassDefinition, IID_IAAFClassDef, cls.outUnknown()),
               AAFRESULT_SUCCESS);
-    Ptr<IUnknown> early;
-    EXPECT_EQ(cls->CreateInstance(IID_IUnknown, early.out()), AAFRESULT_NOT_INITIALIZED);
+    EXPECT_EQ(cls->CreateInstance(IID_IUnknown, Ptr<IUnknown>().out()), AAFRESULT_NOT_INITIALIZED);
     EXPECT_EQ(f.dictionary->RegisterClassDef(cls.get()), AAFRESULT_NOT_INITIALIZED);
     ASSERT_EQ(cls->Initialize(pictureId, parent.get(), L"Picture", kAAFTrue), AAFRESULT_SUCCESS);
     EXPECT_EQ(cls->Initialize(pictureId, parent.get(), L"Picture", kAAFTrue), AAFRESULT_ALREADY_INITIALIZED);

@@ -6,47 +6,36 @@
 #include "aaf/AAF.h"
 
 #define STUB_EXPORT extern "C" __attribute__((visibility("default")))
+// An entry point that answers kStubAnswer.
+#define STUB(name, params) \
+    STUB_EXPORT AAFRESULT name params { return kStubAnswer; }
 
 namespace {
 constexpr AAFRESULT kStubAnswer = 0x00000123;
 }
 
 #ifndef OMIT_AAFFileOpenExistingRead
-STUB_EXPORT AAFRESULT AAFFileOpenExistingRead(const aafCharacter*, aafUInt32, IAAFFile**) { return kStubAnswer; }
+STUB(AAFFileOpenExistingRead, (const aafCharacter*, aafUInt32, IAAFFile**))
 #endif
-STUB_EXPORT AAFRESULT AAFFileOpenExistingModify(const aafCharacter*, aafUInt32, aafProductIdentification_t*,
-                                                IAAFFile**) {
-    return kStubAnswer;
-}
-STUB_EXPORT AAFRESULT AAFFileOpenNewModify(const aafCharacter*, aafUInt32, aafProductIdentification_t*, IAAFFile**) {
-    return kStubAnswer;
-}
+STUB(AAFFileOpenExistingModify, (const aafCharacter*, aafUInt32, aafProductIdentification_t*, IAAFFile**))
+STUB(AAFFileOpenNewModify, (const aafCharacter*, aafUInt32, aafProductIdentification_t*, IAAFFile**))
 #ifndef OMIT_AAFFileOpenNewModifyEx
-STUB_EXPORT AAFRESULT AAFFileOpenNewModifyEx(const aafCharacter*, const aafUID_t*, aafUInt32,
-                                             aafProductIdentification_t*, IAAFFile**) {
-    return kStubAnswer;
-}
+STUB(AAFFileOpenNewModifyEx, (const aafCharacter*, const aafUID_t*, aafUInt32, aafProductIdentification_t*, IAAFFile**))
 #endif
 #ifndef OMIT_AAFFileOpenTransient
-STUB_EXPORT AAFRESULT AAFFileOpenTransient(aafProductIdentification_t*, IAAFFile**) { return kStubAnswer; }
+STUB(AAFFileOpenTransient, (aafProductIdentification_t*, IAAFFile**))
 #endif
 // The published library answers not-implemented here for files it cannot read.
 STUB_EXPORT AAFRESULT AAFFileIsAAFFile(const aafCharacter*, aafUID_t*, aafBool*) { return AAFRESULT_NOT_IMPLEMENTED; }
-STUB_EXPORT AAFRESULT AAFGetPluginManager(IAAFPluginManager**) { return kStubAnswer; }
+STUB(AAFGetPluginManager, (IAAFPluginManager**))
 #ifndef OMIT_AAFCreateRawStorageMemory
-STUB_EXPORT AAFRESULT AAFCreateRawStorageMemory(aafFileAccess_t, IAAFRawStorage**) { return kStubAnswer; }
+STUB(AAFCreateRawStorageMemory, (aafFileAccess_t, IAAFRawStorage**))
 #endif
 #ifndef OMIT_AAFCreateRawStorageDisk
-STUB_EXPORT AAFRESULT AAFCreateRawStorageDisk(const aafCharacter*, aafFileExistence_t, aafFileAccess_t,
-                                              IAAFRawStorage**) {
-    return kStubAnswer;
-}
+STUB(AAFCreateRawStorageDisk, (const aafCharacter*, aafFileExistence_t, aafFileAccess_t, IAAFRawStorage**))
 #endif
-STUB_EXPORT AAFRESULT AAFCreateAAFFileOnRawStorage(IAAFRawStorage*, aafFileExistence_t, aafFileAccess_t,
-                                                   const aafUID_t*, aafUInt32, aafProductIdentification_t*,
-                                                   IAAFFile**) {
-    return kStubAnswer;
-}
+STUB(AAFCreateAAFFileOnRawStorage, (IAAFRawStorage*, aafFileExistence_t, aafFileAccess_t, const aafUID_t*, aafUInt32,
+                                    aafProductIdentification_t*, IAAFFile**))
 STUB_EXPORT AAFRESULT AAFGetLibraryVersion(aafProductVersion_t*) {
 #ifdef THROW_FROM_VERSION
     throw std::runtime_error("thrown inside the library");

@@ -57,9 +57,7 @@ TEST_F(HostConsole, VerbosityFiltersByLevelBitAndHidesTracesByDefault) {
 
     ASSERT_EQ(host->SetVerbosity(1 | 16), TOV_OK);
     EXPECT_EQ(host->GetVerbosity(), 17u);
-    for (uint32_t level : {1, 2, 4, 8, 16}) {
-        ASSERT_EQ(host->Print(level, L"level %d", static_cast<int>(level)), TOV_OK);
-    }
+    for (uint32_t level : {1, 2, 4, 8, 16}) ASSERT_EQ(host->Print(level, L"level %d", static_cast<int>(level)), TOV_OK);
     EXPECT_EQ(host.Lines(), (std::vector<std::pair<uint32_t, std::string>>{{1, "level 1"}, {16, "level 16"}}));
 }
 

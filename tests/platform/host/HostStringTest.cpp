@@ -28,16 +28,10 @@ TOVRESULT InForm(int form, std::u32string_view text, Op op) {
     const std::vector<unsigned short> utf16 = UnicodeCodec::EncodeUTF16(text);
     const std::vector<unsigned int> utf32 = UnicodeCodec::EncodeUTF32(text);
     const std::wstring wide(text.begin(), text.end());
-    switch (form) {
-        case 0:
-            return op(Bytes(utf8.c_str()), static_cast<unsigned int>(utf8.size()));
-        case 1:
-            return op(utf16.data(), static_cast<unsigned int>(utf16.size()));
-        case 2:
-            return op(utf32.data(), static_cast<unsigned int>(utf32.size()));
-        default:
-            return op(wide.c_str(), static_cast<unsigned int>(wide.size()));
-    }
+    if (form == 0) return op(Bytes(utf8.c_str()), static_cast<unsigned int>(utf8.size()));
+    if (form == 1) return op(utf16.data(), static_cast<unsigned int>(utf16.size()));
+    if (form == 2) return op(utf32.data(), static_cast<unsigned int>(utf32.size()));
+    return op(wide.c_str(), static_cast<unsigned int>(wide.size()));
 }
 
 TOVPtr<ITOVString> NewString(_tovUnicodeType type, std::u32string_view text) {
@@ -53,21 +47,17 @@ std::string UTF8Of(ITOVString* s) {
     return reinterpret_cast<const char*>(p);
 }
 
-std::u16string UTF16Of(ITOVString* s) {
-    const unsigned short* p = nullptr;
-    EXPECT_EQ(s->GetUTF16String(&p), TOV_OK);
-    std::u16string text;
-    while (*p) text += static_cast<char16_t>(*p++);
+// The zero-terminated view that `get` hands out, as a string of `Char`.
+template <class Char, class Unit>
+std::basic_string<Char> ViewOf(ITOVString* s, TOVRESULT (ITOVString::*get)(const Unit**)) {
+    const Unit* p = nullptr;
+    EXPECT_EQ((s->*get)(&p), TOV_OK);
+    std::basic_string<Char> text;
+    while (*p) text += static_cast<Char>(*p++);
     return text;
 }
-
-std::u32string UTF32Of(ITOVString* s) {
-    const unsigned int* p = nullptr;
-    EXPECT_EQ(s->GetUTF32String(&p), TOV_OK);
-    std::u32string text;
-    while (*p) text += static_cast<char32_t>(*p++);
-    return text;
-}
+std::u16string UTF16Of(ITOVString* s) { return ViewOf<char16_t>(s, &ITOVString::GetUTF16String); }
+std::u32string UTF32Of(ITOVString* s) { return ViewOf<char32_t>(s, &ITOVString::GetUTF32String); }
 
 std::u32string WideOf(ITOVString* s) {
     wchar_t* p = nullptr;
@@ -138,17 +128,13 @@ TEST_F(HostString, InputEndsAtTheFirstZeroWithinN) {
 }
 
 TEST_F(HostString, RefusesMalformedInputNullPointersAndUnusableBuffersAndKeepsTheText) {
-    unsigned char noTerminator[4] = {'a', 'b', 'c', 'd'};
-    unsigned char malformed[4] = {0xC3, 0, 0, 0};
+    unsigned char noTerminator[4] = {'a', 'b', 'c', 'd'}, malformed[4] = {0xC3, 0, 0, 0}, good[4] = {'a', 0, 0, 0};
     unsigned char oddSize[3] = {'a', 0, 0};  // a UTF-16 terminator needs two bytes
-    unsigned char good[4] = {'a', 0, 0, 0};
     unsigned char byte = 0;
     unsigned int size = 1;
     int position = 0;
-    const unsigned short loneHigh[] = {0x41, 0xD83D};
-    const unsigned short loneLow[] = {0xDE00, 0x41};
-    const unsigned int tooLarge[] = {0x110000};
-    const unsigned int surrogate[] = {0xDC00};
+    const unsigned short loneHigh[] = {0x41, 0xD83D}, loneLow[] = {0xDE00, 0x41};
+    const unsigned int tooLarge[] = {0x110000}, surrogate[] = {0xDC00};
     const wchar_t wideSurrogate[] = {L'a', static_cast<wchar_t>(0xD800)};
     struct Case {
         const char* name;
@@ -475,9 +461,7 @@ TEST_F(HostString, ExternalTextNeedsNoAlignmentAndMayNotGrowPastTheBuffer) {
     ASSERT_EQ(wide->ToUpper(), TOV_OK);
     unsigned short units[3] = {};
     std::memcpy(units, unaligned, sizeof units);
-    EXPECT_EQ(units[0], 0x2C6F);
-    EXPECT_EQ(units[1], 0x41);
-    EXPECT_EQ(units[2], 0);
+    EXPECT_EQ(std::vector<unsigned short>(units, units + 3), (std::vector<unsigned short>{0x2C6F, 0x41, 0}));
     EXPECT_EQ(wide->Append(L"b", 1), TOV_E_OUTOFRANGE);
 
     unsigned char utf32[8] = {0x00, 0xF6, 0x01};  // U+1F600 and a terminator, little-endian

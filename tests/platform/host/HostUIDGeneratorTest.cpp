@@ -69,8 +69,7 @@ TEST_F(UIDGenerator, CopiesTheDigestBytesInOrderWhateverThePieces) {
 }
 
 TEST_F(UIDGenerator, InterleavedContextsAreIndependentOfEachOtherAndOfTheObject) {
-    void* first = nullptr;
-    void* second = nullptr;
+    void *first = nullptr, *second = nullptr;
     ASSERT_EQ(generator->Begin(&first), TOV_OK);
     TOVPtr<ITOVUIDGeneratorMD5> other = NewGenerator(host.Get());
     ASSERT_EQ(other->Begin(&second), TOV_OK);

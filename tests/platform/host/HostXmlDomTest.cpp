@@ -79,16 +79,12 @@ TEST_F(HostXmlDom, AttributesComeAsAListOfAttributeViews) {
     EXPECT_EQ(item->GetNodeType(), kTOVXmlAttribute);
     TOVPtr<ITOVXmlDomAttribute> attribute;
     ASSERT_EQ(item->QueryInterface(IID_ITOVXmlDomAttribute, attribute.Out()), TOV_OK);
-    TOVPtr<ITOVString> name, value, tag;
-    ASSERT_EQ(attribute->GetAttributeName(name.OutT()), TOV_OK);
-    ASSERT_EQ(attribute->GetAttributeValue(value.OutT()), TOV_OK);
-    EXPECT_EQ(Utf8(name.Get()), "name");
-    EXPECT_EQ(Utf8(value.Get()), "Boom & mix");
+    EXPECT_EQ(TextOf(attribute.Get(), &ITOVXmlDomAttribute::GetAttributeName), "name");
+    EXPECT_EQ(TextOf(attribute.Get(), &ITOVXmlDomAttribute::GetAttributeValue), "Boom & mix");
 
     TOVPtr<ITOVXmlDomElement> element;
     ASSERT_EQ(root->QueryInterface(IID_ITOVXmlDomElement, element.Out()), TOV_OK);
-    ASSERT_EQ(element->GetTagName(tag.OutT()), TOV_OK);
-    EXPECT_EQ(Utf8(tag.Get()), "TRACK");
+    EXPECT_EQ(TextOf(element.Get(), &ITOVXmlDomElement::GetTagName), "TRACK");
     EXPECT_EQ(root->QueryInterface(IID_ITOVXmlDomAttribute, attribute.Out()), TOV_E_NOINTERFACE);
 }
 
@@ -108,11 +104,8 @@ TEST_F(HostXmlDom, TextIsUnicodeAndAFileIsReadInItsDeclaredEncoding) {
 }
 
 TEST_F(HostXmlDom, NodesOutliveTheirParser) {
-    TOVPtr<ITOVXmlDomNode> scene;
-    {
-        TOVPtr<ITOVXmlDomNode> root = Root("<BWFXML><SCENE>7</SCENE></BWFXML>");
-        scene = ChildOf(root, 0);
-    }
+    // The parser and the root are gone at the end of this line.
+    const TOVPtr<ITOVXmlDomNode> scene = ChildOf(Root("<BWFXML><SCENE>7</SCENE></BWFXML>"), 0);
     EXPECT_EQ(ValueOf(ChildOf(scene, 0)), "7");
 }
 
@@ -130,11 +123,7 @@ TEST_F(HostXmlDom, MalformedTextFailsWithAReason) {
 
 class HostXmlWriter : public HostXmlDom {
 protected:
-    TOVPtr<ITOVXmlWriter> writer = [this] {
-        TOVPtr<ITOVXmlWriter> made;
-        EXPECT_EQ(host->CreateComponent(CompID_TOVXmlWriter, nullptr, IID_ITOVXmlWriter, made.Out()), TOV_OK);
-        return made;
-    }();
+    TOVPtr<ITOVXmlWriter> writer = NewComponent<ITOVXmlWriter>(host.Get(), CompID_TOVXmlWriter, IID_ITOVXmlWriter);
 };
 
 TEST_F(HostXmlWriter, ElementsNestByTheTagOfTheirParent) {
@@ -146,9 +135,7 @@ TEST_F(HostXmlWriter, ElementsNestByTheTagOfTheirParent) {
         ASSERT_EQ(writer->WriteAttribute(Str("name").Get(), Str(name).Get(), Str("TRACK").Get()), TOV_OK);
         ASSERT_EQ(writer->WriteText(Str(name).Get(), Str("TRACK").Get()), TOV_OK);
     }
-    TOVPtr<ITOVString> text;
-    ASSERT_EQ(writer->GetText(text.OutT()), TOV_OK);
-    const std::string xml = Utf8(text.Get());
+    const std::string xml = TextOf(writer.Get(), &ITOVXmlWriter::GetText);
     EXPECT_EQ(xml,
               "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
               "<BWFXML>\n"

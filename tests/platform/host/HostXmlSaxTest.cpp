@@ -39,8 +39,7 @@ public:
     TOVRESULT Error(ITOVString* message) override { return Own("error", message); }
     TOVRESULT FatalError(ITOVString* message) override { return Own("fatal", message); }
 
-    std::vector<std::string> events;
-    std::vector<std::string> errors;
+    std::vector<std::string> events, errors;
     std::string failAt;
     uint32_t refs = 1;
 
@@ -56,13 +55,16 @@ private:
     }
 };
 
+// A SAX reader of `host` that reports to `handler`.
+TOVPtr<ITOVXmlSaxParser> NewSaxReader(TOVHost* host, RecordingHandler& handler) {
+    auto parser = NewComponent<ITOVXmlSaxParser>(host, CompID_TOVXmlSaxReader, IID_ITOVXmlSaxParser);
+    EXPECT_EQ(parser->SetDocumentHandler(&handler), TOV_OK);
+    EXPECT_EQ(parser->SetErrorHandler(&handler), TOV_OK);
+    return parser;
+}
+
 class HostXmlSax : public ::testing::Test {
 protected:
-    void SetUp() override {
-        ASSERT_EQ(host->CreateComponent(CompID_TOVXmlSaxReader, nullptr, IID_ITOVXmlSaxParser, parser.Out()), TOV_OK);
-        ASSERT_EQ(parser->SetDocumentHandler(&handler), TOV_OK);
-        ASSERT_EQ(parser->SetErrorHandler(&handler), TOV_OK);
-    }
     void TearDown() override {
         parser.Reset();
         EXPECT_EQ(handler.refs, 1u) << "the parser gave its handler references back";
@@ -70,7 +72,7 @@ protected:
 
     TestHost host;
     RecordingHandler handler;
-    TOVPtr<ITOVXmlSaxParser> parser;
+    TOVPtr<ITOVXmlSaxParser> parser = NewSaxReader(host.Get(), handler);
 };
 
 TEST_F(HostXmlSax, ReportsElementsAttributesAndTextInOrder) {
@@ -151,11 +153,7 @@ TEST(LibXmlSafety, ReadersRefuseOrReadWithoutExpansion) {
         }
 
         RecordingHandler handler;
-        TOVPtr<ITOVXmlSaxParser> sax;
-        ASSERT_EQ(host->CreateComponent(CompID_TOVXmlSaxReader, nullptr, IID_ITOVXmlSaxParser, sax.Out()), TOV_OK);
-        sax->SetDocumentHandler(&handler);
-        sax->SetErrorHandler(&handler);
-        const TOVRESULT result = sax->Parse(Str(attack.text).Get(), nullptr);
+        const TOVRESULT result = NewSaxReader(host.Get(), handler)->Parse(Str(attack.text).Get(), nullptr);
         if (!readable) {
             EXPECT_EQ(result, TOV_E_FAIL);
         }

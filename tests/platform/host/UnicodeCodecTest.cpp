@@ -94,19 +94,15 @@ TEST(UnicodeCodec, RefusesUnpairedSurrogatesAndValuesOutOfRange) {
         {0xD800},       {0xDC00},         {0xDC00, 0xDC00},         {0x41, 0xD83D},
         {0xD83D, 0x41}, {0xDE00, 0xD83D}, {0xD800, 0xD800, 0xDC00},
     };
-    for (const auto& units : utf16) {
-        SCOPED_TRACE(testing::PrintToString(units));
-        std::u32string out = U"kept";
-        EXPECT_FALSE(UnicodeCodec::DecodeUTF16(units.data(), units.size(), out));
-        EXPECT_EQ(out, U"kept");
-    }
     const std::vector<unsigned int> utf32[] = {{0xD800}, {0x41, 0xDFFF}, {0x110000}, {0xFFFFFFFF}};
-    for (const auto& units : utf32) {
+    const auto refused = [](const auto& units, auto decode) {
         SCOPED_TRACE(testing::PrintToString(units));
         std::u32string out = U"kept";
-        EXPECT_FALSE(UnicodeCodec::DecodeUTF32(units.data(), units.size(), out));
+        EXPECT_FALSE(decode(units.data(), units.size(), out));
         EXPECT_EQ(out, U"kept");
-    }
+    };
+    for (const auto& units : utf16) refused(units, [](auto... a) { return UnicodeCodec::DecodeUTF16(a...); });
+    for (const auto& units : utf32) refused(units, [](auto... a) { return UnicodeCodec::DecodeUTF32(a...); });
     const wchar_t negative[] = {L'a', static_cast<wchar_t>(-1)};
     std::u32string out;
     EXPECT_FALSE(UnicodeCodec::DecodeUTF32(negative, 2, out));

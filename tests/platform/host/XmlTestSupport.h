@@ -18,10 +18,16 @@ inline TOVPtr<ITOVString> Str(const std::string& utf8) {
 
 inline std::string Utf8(ITOVString* s) { return HostText::Read(s); }
 
+/// A new component `compId` of `host`, asked for `iid`.
+template <class I>
+TOVPtr<I> NewComponent(TOVHost* host, const _tovUID& compId, const _tovUID& iid) {
+    TOVPtr<I> made;
+    EXPECT_EQ(host->CreateComponent(compId, nullptr, iid, made.Out()), TOV_OK);
+    return made;
+}
+
 inline TOVPtr<UTIL::ITOVXmlParser> NewDomReader(TOVHost* host) {
-    TOVPtr<UTIL::ITOVXmlParser> parser;
-    EXPECT_EQ(host->CreateComponent(UTIL::CompID_TOVXmlReader, nullptr, UTIL::IID_ITOVXmlParser, parser.Out()), TOV_OK);
-    return parser;
+    return NewComponent<UTIL::ITOVXmlParser>(host, UTIL::CompID_TOVXmlReader, UTIL::IID_ITOVXmlParser);
 }
 
 /// The root element `parser` read, or an empty pointer.
@@ -32,24 +38,25 @@ inline TOVPtr<UTIL::ITOVXmlDomNode> RootOf(UTIL::ITOVXmlParser* parser) {
     return node;
 }
 
+/// The text that `get` of `object` hands out.
+template <class Object>
+std::string TextOf(Object* object, TOVRESULT (Object::*get)(ITOVString**)) {
+    TOVPtr<ITOVString> s;
+    EXPECT_EQ((object->*get)(s.OutT()), TOV_OK);
+    return Utf8(s.Get());
+}
+
 /// Why the last parse of a DOM or SAX reader failed.
 template <class Parser>
 std::string LastError(Parser* parser) {
-    TOVPtr<ITOVString> error;
-    EXPECT_EQ(parser->GetLastError(error.OutT()), TOV_OK);
-    return Utf8(error.Get());
+    return TextOf(parser, &Parser::GetLastError);
 }
 
 inline std::string NameOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node) {
-    TOVPtr<ITOVString> s;
-    EXPECT_EQ(node->GetName(s.OutT()), TOV_OK);
-    return Utf8(s.Get());
+    return TextOf(node.Get(), &UTIL::ITOVXmlDomNode::GetName);
 }
-
 inline std::string ValueOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node) {
-    TOVPtr<ITOVString> s;
-    EXPECT_EQ(node->GetValue(s.OutT()), TOV_OK);
-    return Utf8(s.Get());
+    return TextOf(node.Get(), &UTIL::ITOVXmlDomNode::GetValue);
 }
 
 inline TOVPtr<UTIL::ITOVXmlDomNode> ChildOf(const TOVPtr<UTIL::ITOVXmlDomNode>& node, uint32_t index) {
