@@ -37,8 +37,7 @@ TEST(TrimFromBeginningAndEnd, TrimsOnlyTheGivenCharacter) {
 
 TEST(GetFullFileNameFromPath, TakesEitherSlash) {
     struct Case {
-        const char* path;
-        const char* name;
+        const char *path, *name;
     };
     const Case cases[] = {
         {"/media/day1/Take7_1.wav", "Take7_1.wav"},
@@ -51,9 +50,7 @@ TEST(GetFullFileNameFromPath, TakesEitherSlash) {
 
 TEST(IsKeywordTRK, WantsOneOrTwoDigits) {
     for (const char* key : {"TRK0", "TRK99"}) EXPECT_TRUE(IsKeywordTRK(key)) << key;
-    for (const char* key : {"TRK", "TRK123", "TRK1a", "trk1", "TRX1", "TRK-1"}) {
-        EXPECT_FALSE(IsKeywordTRK(key)) << key;
-    }
+    for (const char* key : {"TRK", "TRK123", "TRK1a", "trk1", "TRX1", "TRK-1"}) EXPECT_FALSE(IsKeywordTRK(key)) << key;
 }
 
 TEST(TruncateToInteger, TowardsZeroInRangeLowestOutside) {

@@ -59,9 +59,8 @@ TEST_F(GenerateUMIDFromFileContent, ReadsFirstMiddleAndLastBlockByTheFilesSize) 
         // A marker at each block's start, so a block read at any other place
         // shows as the hole's zeros.
         char letter = 'A';
-        for (uint64_t offset : c.offsets) {
+        for (uint64_t offset : c.offsets)
             file.WriteAt(offset, std::string(std::min<uint64_t>(8, c.size - offset), letter++));
-        }
         file.Resize(c.size);
 
         _aafUID_t out{};

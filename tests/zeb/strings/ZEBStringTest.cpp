@@ -147,10 +147,8 @@ TEST_F(ZEBStringOwnership, CopiesAndAssignmentsTakeTheSourcesEncodingButNeverIts
 // Against raw text `>` orders; against another string it means "differs".
 TEST_F(ZEBStringComparison, CaseSensitiveInEveryEncoding) {
     struct Case {
-        const char* left;
-        const char* right;
-        bool equal;
-        bool less;
+        const char *left, *right;
+        bool equal, less;
     };
     const std::vector<Case> cases = {
         {"abc", "abc", true, false},  {"abc", "abd", false, true}, {"abd", "abc", false, false},

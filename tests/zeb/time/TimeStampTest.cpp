@@ -92,9 +92,7 @@ TEST_F(TimeStampText, TooShortTextsFail) {
 TEST_F(TimeStampText, TextForms) {
     struct Case {
         _aafTimeStamp_t stamp;
-        const char* plain;
-        const char* utc;
-        const char* local;
+        const char *plain, *utc, *local;
     };
     const std::vector<Case> cases = {
         {Stamp(2024, 3, 5, 6, 7, 8), "2024-03-05 06:07:08", "2024-03-05T06:07:08Z", "2024-03-05T06:07:08"},
