@@ -104,10 +104,9 @@ TEST_F(HashBuffer, BlockSizesAndPlaces) {
     for (const auto& c : cases) {
         std::string bytes(c.size, '\0');
         for (size_t i = 0; i < c.size; ++i) bytes[i] = static_cast<char>(i % 251);
-        const std::string path = Write("f" + std::to_string(c.size) + ".raw", bytes);
-        std::vector<unsigned char> buffer;
-        ASSERT_TRUE(OrloReader::GetBufferForHash(path, buffer)) << c.size;
         const std::string name = "f" + std::to_string(c.size) + ".raw";
+        std::vector<unsigned char> buffer;
+        ASSERT_TRUE(OrloReader::GetBufferForHash(Write(name, bytes), buffer)) << c.size;
         ASSERT_EQ(buffer.size(), 3 * c.block + name.size()) << c.size;
         const long long middle = static_cast<long long>(c.block) + static_cast<long long>(c.size / 2) -
                                  static_cast<long long>(3 * c.block / 2);

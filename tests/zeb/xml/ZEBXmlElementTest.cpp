@@ -22,10 +22,7 @@ TEST_F(XmlElement, TextJoinsTheDirectTextPiecesOnly) {
         const char* xml;
         std::u16string text;
     } cases[] = {
-        {"<A>one<B>two</B>three</A>", u"onethree"},
-        {"<A><![CDATA[raw]]></A>", u""},
-        {"<A>a<!-- note -->b</A>", u"ab"},
-    };
+        {"<A>one<B>two</B>three</A>", u"onethree"}, {"<A><![CDATA[raw]]></A>", u""}, {"<A>a<!-- note -->b</A>", u"ab"}};
     for (const auto& c : cases) {
         auto doc = Parse(c.xml);
         const ZEBString text = doc->DocumentElement()->GetText();
