@@ -40,8 +40,7 @@ struct HostValueCase {
     const char* name;
     bool hasValue;
     uint32_t value;
-    bool before;
-    bool after;
+    bool before, after;
 };
 
 TEST(AudioImportSettings, HostsDecideWhenTheyHaveAValue) {
@@ -69,9 +68,7 @@ enum class Kept { CallersOwn, HostsObject, Nothing };
 
 struct CallerSettingsCase {
     const char* name;
-    bool ignoreHost;
-    bool withFactory;
-    bool callerGivesOwn;
+    bool ignoreHost, withFactory, callerGivesOwn;
     bool ownAsked;  ///< the caller's object answers 0 when asked
     bool after;     ///< from true, with the host's setting at 0
     Kept kept;

@@ -96,8 +96,7 @@ TOVRESULT Thrown(const std::function<void()>& call) {
 struct AccessCase {
     const char* name;
     std::function<void(MockFactory&, MockManager&)> arrange;
-    TOVRESULT read;
-    TOVRESULT set;
+    TOVRESULT read, set;
 };
 
 const AccessCase kAccessCases[] = {

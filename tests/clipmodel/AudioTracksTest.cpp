@@ -2,6 +2,7 @@
 // every channel, the plain channel order otherwise, and the media of each.
 #include <stdexcept>
 #include <string>
+#include <tuple>
 
 #include "AudioFileWriter.h"
 #include "ClipTest.h"
@@ -149,9 +150,8 @@ TEST(MediaStart, CountsFramesWithTwoDroppedAMinuteInDrop) {
         unsigned short fps = 0;
         bool drop = false;
         media.GetStartTimeCode(frames, fps, drop);
-        EXPECT_EQ(frames, c.frames);
-        EXPECT_EQ(fps, c.start.GetFPS());
-        EXPECT_EQ(drop, c.start.IsDropFrame());
+        EXPECT_EQ(std::make_tuple(frames, fps, drop),
+                  std::make_tuple(c.frames, c.start.GetFPS(), c.start.IsDropFrame()));
     }
 }
 

@@ -13,8 +13,7 @@ using OrloReader::FrameRateSettings;
 struct Case {
     const char* name;
     FrameRateSettings settings;
-    int numerator;
-    int denominator;
+    int numerator, denominator;
     double fps;
     bool drop;
 };

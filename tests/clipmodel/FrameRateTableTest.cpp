@@ -10,8 +10,7 @@ using namespace HelperFunctions;
 
 struct RateCase {
     double fps;
-    int numerator;
-    int denominator;
+    int numerator, denominator;
 };
 
 ::testing::AssertionResult IsRate(const _aafRational_t& rate, int numerator, int denominator) {
@@ -46,8 +45,7 @@ TEST(FrameRateTable, RationalRateFromFPS) {
 TEST(FrameRateTable, StringToFrameRateReadsTheNumberAndTheDropMark) {
     struct Case {
         const char* text;
-        int numerator;
-        int denominator;
+        int numerator, denominator;
         bool drop;
     };
     // Only the first "DF" is looked at; a rate that cannot be drop frame ignores the mark.

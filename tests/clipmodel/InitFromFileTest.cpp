@@ -12,7 +12,13 @@ namespace {
 
 using OrloReader::Movie;
 
-using Intake = ClipFixture;
+class Intake : public ClipFixture {
+protected:
+    TOVRESULT NewMovie(const std::string& path, Movie** movie) {
+        return ZEB::Impl::NewMovieFromFilePath(ZEB::ZEBString(reinterpret_cast<const unsigned char*>(path.c_str())),
+                                               movie, host.Get());
+    }
+};
 
 TEST_F(Intake, FilesThatCannotBeReadGiveTheirCodeAndNoMovie) {
     Payload::Fmt fmt;
@@ -34,18 +40,11 @@ TEST_F(Intake, FilesThatCannotBeReadGiveTheirCodeAndNoMovie) {
     };
     for (const auto& c : cases) {
         Movie* movie = reinterpret_cast<Movie*>(0x1);
-        const std::string path = Write(c.name, c.bytes);
-        EXPECT_EQ(ZEB::Impl::NewMovieFromFilePath(ZEB::ZEBString(reinterpret_cast<const unsigned char*>(path.c_str())),
-                                                  &movie, host.Get()),
-                  c.result)
-            << c.name;
+        EXPECT_EQ(NewMovie(Write(c.name, c.bytes), &movie), c.result) << c.name;
         EXPECT_EQ(movie, nullptr) << c.name;
     }
     Movie* movie = nullptr;
-    const std::string missing = folder + "/missing.wav";
-    EXPECT_EQ(ZEB::Impl::NewMovieFromFilePath(ZEB::ZEBString(reinterpret_cast<const unsigned char*>(missing.c_str())),
-                                              &movie, host.Get()),
-              TOV_E_UNEXPECTED);
+    EXPECT_EQ(NewMovie(folder + "/missing.wav", &movie), TOV_E_UNEXPECTED);
     EXPECT_EQ(ZEB::Impl::NewMovieFromFilePath(ZEB::ZEBString(), &movie, host.Get()), TOV_E_INVALIDARG);
 }
 
@@ -55,9 +54,7 @@ TEST_F(Intake, HandsOverAFilledMovie) {
     file.bext = BextWith("sSCENE=7\r\n");
     const std::string path = Write("Take7_3.wav", file.Bytes());
     Movie* movie = nullptr;
-    ASSERT_EQ(ZEB::Impl::NewMovieFromFilePath(ZEB::ZEBString(reinterpret_cast<const unsigned char*>(path.c_str())),
-                                              &movie, host.Get()),
-              TOV_OK);
+    ASSERT_EQ(NewMovie(path, &movie), TOV_OK);
     ASSERT_NE(movie, nullptr);
     // A mono file's starting track index comes from its numbered name.
     EXPECT_EQ(movie->GetStartingTrackIndex(), 3);

@@ -110,13 +110,11 @@ TEST_F(CircledTake, ComesFromIxmlThenOnlyTheExactBextWords) {
     const struct {
         std::string keywords, ixmlBody;
         std::optional<bool> circled;
-    } cases[] = {
-        {"sCIRCLED=FALSE\r\n", "<CIRCLED>TRUE</CIRCLED>", true},
-        {"sCIRCLED=TRUE\r\n", "", true},
-        {"sCIRCLED=FALSE\r\n", "", false},
-        {"sCIRCLED=true\r\n", "", std::nullopt},
-        {"-", "", std::nullopt},
-    };
+    } cases[] = {{"sCIRCLED=FALSE\r\n", "<CIRCLED>TRUE</CIRCLED>", true},
+                 {"sCIRCLED=TRUE\r\n", "", true},
+                 {"sCIRCLED=FALSE\r\n", "", false},
+                 {"sCIRCLED=true\r\n", "", std::nullopt},
+                 {"-", "", std::nullopt}};
     for (const auto& c : cases) {
         const Movie movie = LoadFile(FileOf(c.keywords, c.ixmlBody));
         EXPECT_EQ(movie.HasMovieCircled() ? std::optional<bool>(movie.GetMovieCircled()) : std::nullopt, c.circled)

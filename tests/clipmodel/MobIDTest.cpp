@@ -1,6 +1,7 @@
 // The clip's identity: the four routes in their order, and the digest's
 // samples of the file, which make the identity independent of the folder.
 #include <string>
+#include <tuple>
 #include <vector>
 
 #include "ClipTest.h"
@@ -18,6 +19,10 @@ const unsigned char kHead[16] = {0x06, 0x0A, 0x2B, 0x34, 0x01, 0x01, 0x01, 0x01,
 std::string Head(const _aafMobID_t& id) { return std::string(reinterpret_cast<const char*>(&id), 16); }
 std::string Material(const _aafMobID_t& id) { return std::string(reinterpret_cast<const char*>(&id.material), 16); }
 std::string HeadBytes() { return std::string(reinterpret_cast<const char*>(kHead), 16); }
+// The material's three numbers and the instance bytes, high then low.
+auto Numbers(const _aafMobID_t& id) {
+    return std::make_tuple(id.material.Data1, id.material.Data2, id.material.Data3, id.instanceHigh, id.instanceLow);
+}
 // A `umid` chunk whose material is sixteen 0x42 bytes.
 const std::string kUmidChunk = std::string(3, '\x01') + std::string(16, '\x42') + std::string(5, '\0');
 
@@ -47,21 +52,12 @@ TEST_F(MobID, RoutesAreTriedInOrderOfTrust) {
     // bext first while the iXML toggle is off. The digits are read back as
     // numbers, then each field's bytes are turned around.
     _aafMobID_t id = LoadFile(file).GetMobID();
-    EXPECT_EQ(id.material.Data1, 0x04030201u);
-    EXPECT_EQ(id.material.Data2, 0x0605u);
-    EXPECT_EQ(id.material.Data3, 0x0807u);
+    EXPECT_EQ(Numbers(id), std::make_tuple(0x04030201u, 0x0605u, 0x0807u, 0x33u, 0x11u));
     EXPECT_EQ(id.material.Data4[7], 0x10);
-    EXPECT_EQ(id.instanceHigh, 0x33);
-    EXPECT_EQ(id.instanceLow, 0x11);
     EXPECT_EQ(std::string(reinterpret_cast<const char*>(&id), 12), HeadBytes().substr(0, 12));
     // ... unless the toggle says they are big-endian already.
     SetToggle(toggle_BigEndianSmpteIdInBEXTData, 1);
-    id = LoadFile(file).GetMobID();
-    EXPECT_EQ(id.material.Data1, 0x01020304u);
-    EXPECT_EQ(id.material.Data2, 0x0506u);
-    EXPECT_EQ(id.material.Data3, 0x0708u);
-    EXPECT_EQ(id.instanceHigh, 0x11);
-    EXPECT_EQ(id.instanceLow, 0x33);
+    EXPECT_EQ(Numbers(LoadFile(file).GetMobID()), std::make_tuple(0x01020304u, 0x0506u, 0x0708u, 0x11u, 0x33u));
 
     // The iXML route takes the first 32 characters themselves as the 32 bytes.
     SetToggle(toggle_MobIDFromiXML, 1);
@@ -104,10 +100,9 @@ TEST_F(HashBuffer, BlockSizesAndPlaces) {
     for (const auto& c : cases) {
         std::string bytes(c.size, '\0');
         for (size_t i = 0; i < c.size; ++i) bytes[i] = static_cast<char>(i % 251);
-        const std::string path = Write("f" + std::to_string(c.size) + ".raw", bytes);
-        std::vector<unsigned char> buffer;
-        ASSERT_TRUE(OrloReader::GetBufferForHash(path, buffer)) << c.size;
         const std::string name = "f" + std::to_string(c.size) + ".raw";
+        std::vector<unsigned char> buffer;
+        ASSERT_TRUE(OrloReader::GetBufferForHash(Write(name, bytes), buffer)) << c.size;
         ASSERT_EQ(buffer.size(), 3 * c.block + name.size()) << c.size;
         const long long middle = static_cast<long long>(c.block) + static_cast<long long>(c.size / 2) -
                                  static_cast<long long>(3 * c.block / 2);

@@ -14,8 +14,7 @@ struct StartCase {
     const char* name;
     std::string keywords;  // "-" for no bext
     uint64_t timeReference;
-    std::string originationTime;
-    std::string ixmlBody;
+    std::string originationTime, ixmlBody;
     const char* toggle;  // switched on, or null
     std::string timecode;
     std::string rate;  // as "num/den"

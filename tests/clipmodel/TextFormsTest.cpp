@@ -2,6 +2,7 @@
 // a start timecode, and the parses and conversions between timecode forms.
 #include <gtest/gtest.h>
 
+#include <array>
 #include <climits>
 
 #include "StartedLibraryTest.h"
@@ -92,10 +93,8 @@ TEST_F(TimecodeText, FillsFromTheRight) {
     for (const Case& c : cases) {
         SCOPED_TRACE(c.text);
         const TimeCodeInfo info = StringToTimecode(Text(c.text));
-        EXPECT_EQ(info.GetHours(), c.hours);
-        EXPECT_EQ(info.GetMinutes(), c.minutes);
-        EXPECT_EQ(info.GetSeconds(), c.seconds);
-        EXPECT_EQ(info.GetFrames(), c.frames);
+        EXPECT_EQ((std::array<int, 4>{info.GetHours(), info.GetMinutes(), info.GetSeconds(), info.GetFrames()}),
+                  (std::array<int, 4>{c.hours, c.minutes, c.seconds, c.frames}));
         EXPECT_EQ(info.GetFPS(), 0);
         EXPECT_FALSE(info.IsDropFrame());
         EXPECT_EQ(info.GetTotalFrames(), -1);

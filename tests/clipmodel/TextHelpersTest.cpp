@@ -27,33 +27,24 @@ TEST(TrimFromBeginningAndEnd, TrimsOnlyTheGivenCharacter) {
         const char* trimmed;
     };
     const Case cases[] = {
-        {"  Roll 7  ", ' ', "Roll 7"},
-        {"   ", ' ', ""},
-        {"\tA\t", ' ', "\tA\t"},
-        {"xxAxBxx", 'x', "AxB"},
-    };
+        {"  Roll 7  ", ' ', "Roll 7"}, {"   ", ' ', ""}, {"\tA\t", ' ', "\tA\t"}, {"xxAxBxx", 'x', "AxB"}};
     for (const Case& c : cases) EXPECT_EQ(TrimFromBeginningAndEnd(c.text, c.c), c.trimmed) << c.text;
 }
 
 TEST(GetFullFileNameFromPath, TakesEitherSlash) {
     struct Case {
-        const char* path;
-        const char* name;
+        const char *path, *name;
     };
-    const Case cases[] = {
-        {"/media/day1/Take7_1.wav", "Take7_1.wav"},
-        {"C:\\media\\Take7_1.wav", "Take7_1.wav"},
-        {"/media\\mixed/a.wav", "a.wav"},
-        {"/media/folder/", ""},
-    };
+    const Case cases[] = {{"/media/day1/Take7_1.wav", "Take7_1.wav"},
+                          {"C:\\media\\Take7_1.wav", "Take7_1.wav"},
+                          {"/media\\mixed/a.wav", "a.wav"},
+                          {"/media/folder/", ""}};
     for (const Case& c : cases) EXPECT_EQ(GetFullFileNameFromPath(c.path), c.name) << c.path;
 }
 
 TEST(IsKeywordTRK, WantsOneOrTwoDigits) {
     for (const char* key : {"TRK0", "TRK99"}) EXPECT_TRUE(IsKeywordTRK(key)) << key;
-    for (const char* key : {"TRK", "TRK123", "TRK1a", "trk1", "TRX1", "TRK-1"}) {
-        EXPECT_FALSE(IsKeywordTRK(key)) << key;
-    }
+    for (const char* key : {"TRK", "TRK123", "TRK1a", "trk1", "TRX1", "TRK-1"}) EXPECT_FALSE(IsKeywordTRK(key)) << key;
 }
 
 TEST(TruncateToInteger, TowardsZeroInRangeLowestOutside) {

@@ -150,8 +150,7 @@ TEST(Timecode, ChangeDropKeepsTheDisplayedTimecode) {
 struct SamplesCase {
     const char* name;
     long long samples;
-    double sampleRate;
-    double fps;
+    double sampleRate, fps;
     int fpsIn;
     bool dropIn;
     int fpsOut;

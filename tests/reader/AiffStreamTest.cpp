@@ -34,8 +34,7 @@ struct AiffRow {
     std::string bytes;
     const char* error;  // null when the stream is good
     uint16_t bits;
-    bool floating;
-    bool dataWrongEndian;
+    bool floating, dataWrongEndian;
 };
 void PrintTo(const AiffRow& row, std::ostream* os) { *os << row.name; }
 

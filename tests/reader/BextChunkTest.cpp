@@ -103,8 +103,7 @@ using UmidChunk = ReaderFixture;
 TEST_F(UmidChunk, IsValidWhenAnyByteIsSet) {
     const struct {
         std::string payload;
-        bool accepted;
-        bool valid;
+        bool accepted, valid;
     } rows[] = {{std::string(24, '\0'), true, false},
                 {std::string(23, '\0') + "\x01", true, true},
                 {std::string(16, '\x01'), false, false}};

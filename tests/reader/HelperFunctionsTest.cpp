@@ -82,8 +82,7 @@ TEST(ExtendedFloat, ReadsTheRatesOfRecordersAndClearsTheSignBit) {
 TEST(Int24, KeepsTheLow24BitsSignExtendsAndSwapsOuterBytes) {
     const struct {
         int assigned;
-        int32_t value;
-        int32_t swapped;
+        int32_t value, swapped;
     } rows[] = {{0, 0, 0},
                 {-1, -1, -1},
                 {0x7FFFFF, 8388607, -129},

@@ -1,6 +1,8 @@
 // Files of every supported format, width and a few channel counts, written by
 // the test writer and read back: the stream must find every sample where the
 // writer put it.
+#include <tuple>
+
 #include "AudioFileWriter.h"
 #include "Bytes.h"
 #include "ChunkPayloads.h"
@@ -95,15 +97,14 @@ TEST_F(SampleLayout, EveryFormatReadsBackAsWritten) {
             auto stream = Open(bytes);
             ASSERT_EQ(stream->GetError(), nullptr);
             const uint16_t sampleSize = format.bits / 8;
-            EXPECT_EQ(stream->GetChannelCount(), channels);
-            EXPECT_EQ(stream->GetBitsPerSample(), format.bits);
-            EXPECT_EQ(stream->GetIsDataFloatingPoint(), format.floating);
-            EXPECT_EQ(stream->GetSampleRate(), kRate);
-            EXPECT_EQ(stream->GetSampleCount(), kFrames);
-            EXPECT_EQ(stream->GetSampleSize(), sampleSize);
-            EXPECT_EQ(stream->GetIsDataWrongEndian(), format.dataWrongEndian);
-            EXPECT_EQ(stream->IsRF64(), format.container == Container::RF64);
-            EXPECT_EQ(stream->IsFileWrongEndian(), format.container >= Container::Aiff);
+            // Channels, bits, floating, rate, frames, sample size, data order, RF64, file order.
+            EXPECT_EQ(
+                std::make_tuple(stream->GetChannelCount(), stream->GetBitsPerSample(), stream->GetIsDataFloatingPoint(),
+                                stream->GetSampleRate(), stream->GetSampleCount(), stream->GetSampleSize(),
+                                stream->GetIsDataWrongEndian(), stream->IsRF64(), stream->IsFileWrongEndian()),
+                std::make_tuple(channels, format.bits, format.floating, kRate, kFrames, sampleSize,
+                                format.dataWrongEndian, format.container == Container::RF64,
+                                format.container >= Container::Aiff));
             EXPECT_EQ(stream->GetBytesRemaining(), -1) << "the file is closed after construction";
             for (uint32_t frame : {0u, 1u, kFrames - 1}) {
                 const int64_t at = stream->GetSamplePosition(frame);

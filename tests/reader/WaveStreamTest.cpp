@@ -240,9 +240,7 @@ TEST_F(WaveStream, FormFrameWithWaveChunksReadsThemBigEndian) {
 struct FmtRow {
     const char* name;
     std::string payload;
-    bool accepted;
-    bool pcm;
-    bool floating;
+    bool accepted, pcm, floating;
 };
 void PrintTo(const FmtRow& row, std::ostream* os) { *os << row.name; }
 

@@ -24,8 +24,7 @@ protected:
 
 struct Repair {
     const char* name;
-    std::string written;
-    std::string read;
+    std::string written, read;
 };
 
 TEST_F(IxmlChunk, TextIsMendedBeforeAnyoneParsesIt) {

@@ -18,8 +18,7 @@ TEST_F(IXMLTextParsers, FrameRates) {
     const struct {
         const char* text;
         bool ok;
-        int32_t numerator;
-        int32_t denominator;
+        int32_t numerator, denominator;
     } cases[] = {
         {"30000/1001", true, 30000, 1001},
         {"25/1", true, 25, 1},
@@ -48,10 +47,7 @@ TEST_F(IXMLTextParsers, FrameRates) {
 TEST_F(IXMLTextParsers, WordsAreExactCapitals) {
     const struct {
         const char* text;
-        bool boolOk;
-        bool boolValue;
-        bool dropOk;
-        bool dropValue;
+        bool boolOk, boolValue, dropOk, dropValue;
     } cases[] = {
         {"TRUE", true, true, false, false},   {"FALSE", true, false, false, false},
         {"true", false, false, false, false}, {" TRUE", false, false, false, false},

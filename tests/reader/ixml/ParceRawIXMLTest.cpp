@@ -131,10 +131,7 @@ TEST_F(IxmlDocument, ValuesThatCountAsAbsent) {
 TEST_F(IxmlDocument, SpeedVariants) {
     const struct {
         const char* speed;
-        bool hasRate;
-        bool hasFlag;
-        bool drop;
-        bool hasSamples;
+        bool hasRate, hasFlag, drop, hasSamples;
     } cases[] = {
         {"<TIMECODE_RATE>30000/1001</TIMECODE_RATE><TIMECODE_FLAG>DF</TIMECODE_FLAG>", true, true, true, false},
         {"<TIMECODE_RATE>25</TIMECODE_RATE><TIMECODE_FLAG>ndf</TIMECODE_FLAG>", false, false, false, false},

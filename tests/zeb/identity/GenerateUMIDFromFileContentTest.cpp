@@ -22,6 +22,7 @@ constexpr uint64_t kMiB = 1024 * 1024;
 constexpr uint64_t kBlock = 4 * kMiB;
 
 const unsigned char* U8(const std::string& text) { return reinterpret_cast<const unsigned char*>(text.c_str()); }
+const _aafUID_t kMarked = {0x11111111, 0x2222, 0x3333, {4, 4, 4, 4, 4, 4, 4, 4}};
 
 // Up to 8 bytes of the file from `offset`, as the generator's log keeps them.
 std::string HeadAt(const std::string& path, uint64_t offset, uint64_t size) {
@@ -59,9 +60,8 @@ TEST_F(GenerateUMIDFromFileContent, ReadsFirstMiddleAndLastBlockByTheFilesSize) 
         // A marker at each block's start, so a block read at any other place
         // shows as the hole's zeros.
         char letter = 'A';
-        for (uint64_t offset : c.offsets) {
+        for (uint64_t offset : c.offsets)
             file.WriteAt(offset, std::string(std::min<uint64_t>(8, c.size - offset), letter++));
-        }
         file.Resize(c.size);
 
         _aafUID_t out{};
@@ -94,20 +94,16 @@ TEST_F(GenerateUMIDFromFileContent, TakesThePathInAnyEncoding) {
 }
 
 TEST_F(GenerateUMIDFromFileContent, RefusesMissingArgumentsAndLeavesOutAlone) {
-    const _aafUID_t marked = {0x11111111, 0x2222, 0x3333, {4, 4, 4, 4, 4, 4, 4, 4}};
-    _aafUID_t out = marked;
-    ZEBString empty(U8(""));
+    _aafUID_t out = kMarked;
     TempFile file("x");
-    ZEBString path(U8(file.Path()));
     EXPECT_EQ(ZEB::GenerateUMIDFromFileContent(nullptr, &out), TOV_E_INVALIDARG);
-    EXPECT_EQ(ZEB::GenerateUMIDFromFileContent(empty.InArg(), &out), TOV_E_INVALIDARG);
-    EXPECT_EQ(ZEB::GenerateUMIDFromFileContent(path.InArg(), nullptr), TOV_E_INVALIDARG);
-    EXPECT_EQ(out, marked);
+    EXPECT_EQ(ZEB::GenerateUMIDFromFileContent(ZEBString(U8("")).InArg(), &out), TOV_E_INVALIDARG);
+    EXPECT_EQ(ZEB::GenerateUMIDFromFileContent(ZEBString(U8(file.Path())).InArg(), nullptr), TOV_E_INVALIDARG);
+    EXPECT_EQ(out, kMarked);
     EXPECT_EQ(log().begins, 0);
 }
 
 TEST_F(GenerateUMIDFromFileContent, FailuresEndTheWorkAndReleaseTheGenerator) {
-    const _aafUID_t marked = {0x11111111, 0x2222, 0x3333, {4, 4, 4, 4, 4, 4, 4, 4}};
     const _aafUID_t cleared{};
     const _aafUID_t ofThreeHoles = FakeUIDOf(std::string(3 * kBlock, '\0'));
     TempFile big("");
@@ -126,7 +122,7 @@ TEST_F(GenerateUMIDFromFileContent, FailuresEndTheWorkAndReleaseTheGenerator) {
     };
     using G = GeneratorFactory::Generator;
     const std::vector<Case> cases = {
-        {"no generator", G::Missing, TOV_OK, TOV_OK, TOV_OK, big.Path(), TOV_E_UNEXPECTED, marked, 0, 0, 0},
+        {"no generator", G::Missing, TOV_OK, TOV_OK, TOV_OK, big.Path(), TOV_E_UNEXPECTED, kMarked, 0, 0, 0},
         {"null generator", G::NullOnSuccess, TOV_OK, TOV_OK, TOV_OK, big.Path(), TOV_E_UNEXPECTED, cleared, 0, 0, 0},
         {"missing file", G::Fake, TOV_OK, TOV_OK, TOV_OK, missing, TOV_E_FILEOPEN, cleared, 0, 0, 0},
         {"begin fails", G::Fake, TOV_E_FAIL, TOV_OK, TOV_OK, big.Path(), TOV_E_FAIL, cleared, 1, 0, 0},
@@ -139,7 +135,7 @@ TEST_F(GenerateUMIDFromFileContent, FailuresEndTheWorkAndReleaseTheGenerator) {
         log().addResult = c.add;
         log().finishResult = c.finish;
         factory.generator = c.generator;
-        _aafUID_t out = marked;
+        _aafUID_t out = kMarked;
         EXPECT_EQ(Generate(c.path, &out), c.expected) << c.name;
         EXPECT_EQ(log().begins, c.begins) << c.name;
         EXPECT_EQ(log().added.size(), c.added) << c.name;

@@ -19,10 +19,7 @@ TEST_F(StandardizePathInPlace, RewritesBackslashesInTheStringItself) {
         std::wstring expected;
     };
     const std::vector<Case> cases = {
-        {"\\\\server\\share\\", L"//server/share/"},
-        {"caf\xC3\xA9\\\xE2\x82\xAC", L"caf\u00E9/\u20AC"},
-        {"", L""},
-    };
+        {"\\\\server\\share\\", L"//server/share/"}, {"caf\xC3\xA9\\\xE2\x82\xAC", L"caf\u00E9/\u20AC"}, {"", L""}};
     for (const auto& c : cases) {
         ZEBString path(reinterpret_cast<const unsigned char*>(c.path));
         ITOVString* before = path.InArg();

@@ -74,11 +74,9 @@ TEST_F(LibraryStartup, AFailedStartLeavesNothingAndCanBeRetried) {
     const struct {
         FaultyFactory::Fault fault;
         TOVRESULT expected;
-    } cases[] = {
-        {FaultyFactory::Fault::ClassFactory, TOV_E_FAIL},
-        {FaultyFactory::Fault::Definition, TOV_E_POINTER},
-        {FaultyFactory::Fault::Console, TOV_E_NOINTERFACE},
-    };
+    } cases[] = {{FaultyFactory::Fault::ClassFactory, TOV_E_FAIL},
+                 {FaultyFactory::Fault::Definition, TOV_E_POINTER},
+                 {FaultyFactory::Fault::Console, TOV_E_NOINTERFACE}};
     for (const auto& c : cases) {
         FaultyFactory faulty(host.Get(), c.fault);
         EXPECT_EQ(ZEBInitialize(&faulty), c.expected);

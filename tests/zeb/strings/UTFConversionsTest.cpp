@@ -59,13 +59,11 @@ TEST(UTFConversions, FromUTF16) {
         std::vector<unsigned short> units;
         std::wstring expected;
     };
-    const std::vector<Case> cases = {
-        {"BMP", {u'a', 0xE9, 0x20AC}, L"aé€"},
-        {"surrogate pair", {0xD83D, 0xDE00, u'!'}, L"\U0001F600!"},
-        {"byte order mark is text", {0xFEFF, u'x'}, L"\uFEFFx"},
-        {"cut-short pair ends the text", {u'a', 0xD83D}, L"a"},
-        {"empty", {}, L""},
-    };
+    const std::vector<Case> cases = {{"BMP", {u'a', 0xE9, 0x20AC}, L"aé€"},
+                                     {"surrogate pair", {0xD83D, 0xDE00, u'!'}, L"\U0001F600!"},
+                                     {"byte order mark is text", {0xFEFF, u'x'}, L"\uFEFFx"},
+                                     {"cut-short pair ends the text", {u'a', 0xD83D}, L"a"},
+                                     {"empty", {}, L""}};
     for (auto c : cases) {
         c.units.push_back(0);
         EXPECT_EQ(ZEB::fromUTF16(c.units.data()), c.expected) << c.name;

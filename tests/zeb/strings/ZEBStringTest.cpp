@@ -147,10 +147,8 @@ TEST_F(ZEBStringOwnership, CopiesAndAssignmentsTakeTheSourcesEncodingButNeverIts
 // Against raw text `>` orders; against another string it means "differs".
 TEST_F(ZEBStringComparison, CaseSensitiveInEveryEncoding) {
     struct Case {
-        const char* left;
-        const char* right;
-        bool equal;
-        bool less;
+        const char *left, *right;
+        bool equal, less;
     };
     const std::vector<Case> cases = {
         {"abc", "abc", true, false},  {"abc", "abd", false, true}, {"abd", "abc", false, false},
@@ -182,15 +180,12 @@ TEST_F(ZEBStringSearch, GivesCharacterIndexesOrMinusOne) {
     // The emoji takes two UTF-16 units but is one character.
     const ZEBString s(U16(u"\U0001F600ab-ab"));
     const ZEBString needle(U8("ab"));
-    EXPECT_EQ(s.FindString(U8("ab"), 0), 1);
-    EXPECT_EQ(s.FindString(U16(u"ab"), 2), 4);
-    EXPECT_EQ(s.FindString(U32(U"ab"), 5), -1);
-    EXPECT_EQ(s.FindString(needle.InArg(), 0), 1);
-    EXPECT_EQ(s.FindString(U8("zz"), 0), -1);
-    EXPECT_EQ(s.FindStringReverse(U8("ab"), -1), 4);
-    EXPECT_EQ(s.FindStringReverse(U16(u"ab"), 3), 1);
-    EXPECT_EQ(s.FindStringReverse(U32(U"ab"), 0), -1);
-    EXPECT_EQ(s.FindStringReverse(needle.InArg(), -1), 4);
+    EXPECT_EQ((std::vector<int>{s.FindString(U8("ab"), 0), s.FindString(U16(u"ab"), 2), s.FindString(U32(U"ab"), 5),
+                                s.FindString(needle.InArg(), 0), s.FindString(U8("zz"), 0)}),
+              (std::vector<int>{1, 4, -1, 1, -1}));
+    EXPECT_EQ((std::vector<int>{s.FindStringReverse(U8("ab"), -1), s.FindStringReverse(U16(u"ab"), 3),
+                                s.FindStringReverse(U32(U"ab"), 0), s.FindStringReverse(needle.InArg(), -1)}),
+              (std::vector<int>{4, 1, -1, 4}));
 }
 
 TEST_F(ZEBStringEncoding, ConcatenationTakesTheEncodingOfTheLeftOperand) {

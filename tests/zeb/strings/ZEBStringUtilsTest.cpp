@@ -64,8 +64,7 @@ TEST_F(ZEBStringUtils, PathPiecesNeverTakeIndexZeroAsASeparatorOrDot) {
 
 TEST_F(ZEBStringUtils, CombinePath) {
     struct Case {
-        const char* base;
-        const char* relative;
+        const char *base, *relative;
         const wchar_t* expected;
     };
     const std::vector<Case> cases = {
@@ -137,10 +136,8 @@ TEST_F(ZEBStringUtils, CreateZEBStringCutsToANonNegativeCount) {
 
 TEST_F(ZEBStringUtils, PrefixAndSuffixIgnoreAsciiCaseWhateverTheLastArgument) {
     struct Case {
-        const char* s;
-        const char* pattern;
-        bool starts;
-        bool ends;
+        const char *s, *pattern;
+        bool starts, ends;
     };
     const std::vector<Case> cases = {
         {"ABC", "ab", true, false},  {"A.WAV", ".wav", false, true}, {"abc", "", true, true},
@@ -168,8 +165,7 @@ TEST_F(ZEBStringUtils, PrefixAndSuffixIgnoreAsciiCaseWhateverTheLastArgument) {
 
 TEST_F(ZEBStringUtils, FixLengthPatternMatch) {
     struct Case {
-        const char* s;
-        const char* pattern;
+        const char *s, *pattern;
         int ignoreCase;
         bool expected;
     };
@@ -191,8 +187,7 @@ TEST_F(ZEBStringUtils, FixLengthPatternMatch) {
 
 TEST_F(ZEBStringUtils, IsSameCharFoldsOnlyAsciiLetters) {
     struct Case {
-        wchar_t a;
-        wchar_t b;
+        wchar_t a, b;
         int ignoreCase;
         bool expected;
     };

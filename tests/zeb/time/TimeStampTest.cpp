@@ -41,11 +41,9 @@ TEST(ConvertTime, GivesTheUTCDateAlone) {
         long t;
         _aafTimeStamp_t expected;
     };
-    const std::vector<Case> cases = {
-        {951782400, Stamp(2000, 2, 29, 0, 0, 0)},
-        {951782400 + 86399, Stamp(2000, 2, 29, 0, 0, 0)},
-        {-1, Stamp(1969, 12, 31, 0, 0, 0)},
-    };
+    const std::vector<Case> cases = {{951782400, Stamp(2000, 2, 29, 0, 0, 0)},
+                                     {951782400 + 86399, Stamp(2000, 2, 29, 0, 0, 0)},
+                                     {-1, Stamp(1969, 12, 31, 0, 0, 0)}};
     for (const auto& c : cases) {
         _aafTimeStamp_t out = Stale();
         EXPECT_EQ(ConvertTime(c.t, &out), TOV_OK) << c.t;
@@ -92,9 +90,7 @@ TEST_F(TimeStampText, TooShortTextsFail) {
 TEST_F(TimeStampText, TextForms) {
     struct Case {
         _aafTimeStamp_t stamp;
-        const char* plain;
-        const char* utc;
-        const char* local;
+        const char *plain, *utc, *local;
     };
     const std::vector<Case> cases = {
         {Stamp(2024, 3, 5, 6, 7, 8), "2024-03-05 06:07:08", "2024-03-05T06:07:08Z", "2024-03-05T06:07:08"},

@@ -12,8 +12,7 @@ using namespace ZEB;
 
 TEST(TimecodeFigures, PerRate) {
     struct Case {
-        unsigned int fps;
-        unsigned int dropped;
+        unsigned int fps, dropped;
         bool high;
         unsigned int low;
         unsigned int maxDrop;  // also the figure without a drop argument

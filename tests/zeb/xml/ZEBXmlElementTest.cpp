@@ -22,10 +22,7 @@ TEST_F(XmlElement, TextJoinsTheDirectTextPiecesOnly) {
         const char* xml;
         std::u16string text;
     } cases[] = {
-        {"<A>one<B>two</B>three</A>", u"onethree"},
-        {"<A><![CDATA[raw]]></A>", u""},
-        {"<A>a<!-- note -->b</A>", u"ab"},
-    };
+        {"<A>one<B>two</B>three</A>", u"onethree"}, {"<A><![CDATA[raw]]></A>", u""}, {"<A>a<!-- note -->b</A>", u"ab"}};
     for (const auto& c : cases) {
         auto doc = Parse(c.xml);
         const ZEBString text = doc->DocumentElement()->GetText();
@@ -89,8 +86,7 @@ TEST_F(XmlElement, AttributePairsMustAllMatchElementPairsNeedOne) {
         nameUpper{U16(u"KIND"), U16(u"Mic")}, nTwo{U16(u"n"), U16(u"2")};
     const struct {
         std::vector<_ZEBXMLATTRPAIR> pairs;
-        int flag;
-        int expected;
+        int flag, expected;
     } attributeCases[] = {
         {{}, 0, 1}, {{kindLower}, 0, 1}, {{kindLower}, 1, 0}, {{nameUpper}, 0, 0}, {{kindMic, nTwo}, 0, 0},
     };
@@ -102,8 +98,7 @@ TEST_F(XmlElement, AttributePairsMustAllMatchElementPairsNeedOne) {
         nope{U16(u"NAME"), U16(u"Nope")};
     const struct {
         std::vector<_ZEBXMLELEMPAIR> pairs;
-        int flag;
-        int expected;
+        int flag, expected;
     } elementCases[] = {
         {{}, 0, 1}, {{lav}, 0, 1}, {{lav}, 1, 0}, {{nope, boom}, 0, 1}, {{nope}, 0, 0},
     };
@@ -142,8 +137,7 @@ TEST_F(XmlElement, SettingABoundAttributeKeepsItsName) {
 
 TEST_F(XmlElement, ChangesThatAreRefused) {
     const struct {
-        const char* what;
-        const char* xml;
+        const char *what, *xml;
         std::function<TOVRESULT(ZEBXmlElement&)> call;
         TOVRESULT expected;
     } cases[] = {
