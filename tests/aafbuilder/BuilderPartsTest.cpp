@@ -10,6 +10,8 @@ namespace {
 
 using aaftest::Query;
 using namespace OrloReader;
+using AddAudioDescriptor = BuilderTest;
+using URLUtils = BuilderTest;
 
 TEST(FrameRateAndDropToString, BaseByNumeratorSuffixByWholeFrames) {
     const struct {
@@ -36,7 +38,7 @@ std::shared_ptr<Media> AudioMedia(double rate, bool bigEndian, bool floatingPoin
 
 // Compression only for floating point (first) or big-endian data; the byte
 // rate from the exact sample rate, the rational from its whole part.
-TEST_F(BuilderTest, PCMDescriptorOfAMedia) {
+TEST_F(AddAudioDescriptor, PCMDescriptorOfAMedia) {
     const struct {
         std::shared_ptr<Media> media;
         TOVRESULT result;
@@ -64,7 +66,7 @@ TEST_F(BuilderTest, PCMDescriptorOfAMedia) {
     }
 }
 
-TEST_F(BuilderTest, MultipleDescriptorKeepsTheFirstRate) {
+TEST_F(AddAudioDescriptor, MultipleDescriptorKeepsTheFirstRate) {
     aaftest::TransientFile f(&AAFFileOpenTransient);
     auto multiple = f.Create<IAAFMultipleDescriptor>(kAAFClassID_MultipleDescriptor);
     ASSERT_EQ(multiple->Initialize(), AAFRESULT_SUCCESS);
@@ -78,7 +80,7 @@ TEST_F(BuilderTest, MultipleDescriptorKeepsTheFirstRate) {
     EXPECT_NE(dump.find("FileDescriptors: [2]"), std::string::npos) << dump;
 }
 
-TEST_F(BuilderTest, PathsBecomeFileURLs) {
+TEST_F(URLUtils, PathsBecomeFileURLs) {
     const struct {
         const char* path;
         const char* url;
@@ -105,7 +107,7 @@ TEST_F(BuilderTest, PathsBecomeFileURLs) {
     EXPECT_EQ(ZEB::MakeURLPathFromFilePath(nullptr, nullptr), TOV_E_INVALIDARG);
 }
 
-TEST_F(BuilderTest, FileURLsBecomePaths) {
+TEST_F(URLUtils, FileURLsBecomePaths) {
     const struct {
         bool partial;
         const char* url;
