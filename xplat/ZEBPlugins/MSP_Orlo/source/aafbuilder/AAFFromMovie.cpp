@@ -6,10 +6,10 @@
 #include "aafbuilder/AddMovieMetaData.h"
 #include "aafbuilder/AddTimecode.h"
 #include "aafbuilder/CAAFBuiltinDefs.h"
+#include "aafbuilder/WideThroughString.h"
 #include "boundary/OrloRegInfo.h"
 #include "clipmodel/TruncateToInteger.h"
 #include "identity/GetProductID.h"
-#include "strings/UTFConversions.h"
 #include "time/GetMaxDuration.h"
 #include "tov/sdk/TOVFailureStyle.h"
 
@@ -43,12 +43,7 @@ struct NewMob {
     }
 };
 
-void SetName(IAAFMob* mob, const std::string& utf8) {
-    const ZEBString text(reinterpret_cast<const unsigned char*>(utf8.c_str()));
-    std::wstring name;
-    wFromUTF8(reinterpret_cast<const char*>(text.GetUTF8String()), name);
-    TOVCheck(mob->SetName(name.c_str()));
-}
+void SetName(IAAFMob* mob, const std::string& utf8) { TOVCheck(mob->SetName(WideThroughString(utf8).c_str())); }
 
 // Where the file starts on the tape, in edit units of `movieRate`. Worked out
 // in single precision on purpose: the host's clips have always been placed so,

@@ -1,8 +1,7 @@
 #include "aafbuilder/AddMovieMetaData.h"
 
 #include "aafbuilder/FrameRateAndDropToString.h"
-#include "strings/UTFConversions.h"
-#include "strings/ZEBString.h"
+#include "aafbuilder/WideThroughString.h"
 
 namespace ZEB {
 namespace Impl {
@@ -10,13 +9,6 @@ namespace Impl {
 namespace {
 
 const char* YesNo(bool value) { return value ? "yes" : "no"; }
-
-std::wstring WideThroughString(const std::string& utf8) {
-    const ZEBString text(reinterpret_cast<const unsigned char*>(utf8.c_str()));
-    std::wstring wide;
-    wFromUTF8(reinterpret_cast<const char*>(text.GetUTF8String()), wide);
-    return wide;
-}
 
 void WriteComments(IAAFMob* mob, const OrloReader::Movie& m) {
     if (m.HasMovieNotes()) AddCustomColumnEntry(mob, "Comments", m.GetMovieNotes());

@@ -61,9 +61,7 @@ TOVRESULT DecodeEscapes(const char* utf8, ZEBString& path) {
 }
 
 std::string UTF8Text(const ZEBString& s) {
-    ZEBString copy(s);
-    copy.ConvertTo(kTOVUnicodeUTF8);
-    return reinterpret_cast<const char*>(copy.GetUTF8String());
+    return reinterpret_cast<const char*>(ZEBStringUtils::GetUTF8ZEBString(s).GetUTF8String());
 }
 
 }  // namespace
