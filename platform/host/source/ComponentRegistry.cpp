@@ -28,6 +28,10 @@ const ComponentRegistry::Entry* ComponentRegistry::FindComponent(const _tovUID& 
     return nullptr;
 }
 
+ComponentRegistry::Entry* ComponentRegistry::FindComponent(const _tovUID& compID) {
+    return const_cast<Entry*>(static_cast<const ComponentRegistry*>(this)->FindComponent(compID));
+}
+
 const ComponentRegistry::Entry* ComponentRegistry::FindClass(const _tovUID& clsid) const {
     for (const Entry& e : m_Entries)
         if (e.clsid == clsid) return &e;

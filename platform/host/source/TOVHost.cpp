@@ -62,11 +62,13 @@ TOVRESULT TOVHost::CreateComponent(const _tovUID& compID, ITOVUnknown* outer, co
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
         *out = nullptr;
-        const ComponentRegistry::Entry* entry = m_Registry.FindComponent(compID);
+        ComponentRegistry::Entry* entry = m_Registry.FindComponent(compID);
         if (!entry) return ZEB_E_NOTFOUND;
         TOVPtr<ITOVClassFactory> factory;
         TOVCheck(GetClassFactory(entry->clsid, IID_ITOVClassFactory, factory.Out()));
-        return factory->CreateInstance(AsUnknown(), outer, iid, out);
+        const TOVRESULT result = factory->CreateInstance(AsUnknown(), outer, iid, out);
+        if (result >= 0) ++entry->created;
+        return result;
     });
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 /// The host's table of components: identifier, class, definition, and where
 /// the class comes from (a creator built into the host, or a loaded module).
+#include <cstdint>
 #include <vector>
 
 #include "tov/ITOVComponentDefinition.h"
@@ -18,6 +19,7 @@ public:
         TOVPtr<ITOVComponentDefinition> definition;
         CTOVClassFactory::Creator creator;  ///< set for built-in classes
         PluginModule* module;               ///< set for classes of a module, not owned
+        uint32_t created = 0;               ///< instances made through the host's factory
     };
 
     /// Adds a component described by `definition` (which holds its identifier
@@ -29,6 +31,7 @@ public:
     void Clear() { m_Entries.clear(); }
 
     const Entry* FindComponent(const _tovUID& compID) const;
+    Entry* FindComponent(const _tovUID& compID);
     const Entry* FindClass(const _tovUID& clsid) const;
     const std::vector<Entry>& Entries() const { return m_Entries; }
 

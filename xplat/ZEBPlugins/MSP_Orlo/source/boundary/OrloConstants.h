@@ -21,3 +21,19 @@ inline constexpr const char* toggle_IgnoreHostSettingsForUnitTest =
 
 /// The feature group all the toggles are registered in.
 inline constexpr const char* kOrloFeatureGroup = "orrin.released.features";
+
+/// One row of the file name extensions the container offers the host's file
+/// dialogs: no dot, upper case.
+struct OrloFileExtension {
+    const char* extension;
+    const char* shortName;
+    const char* description;
+};
+
+/// The container's extension table, in the order the host is told it.
+inline constexpr OrloFileExtension kOrloFileExtensions[] = {
+    {"WAV", "WAV Files", "Waveform Audio File Format"},      {"WAVE", "WAVE Files", "Waveform Audio File Format"},
+    {"BWF", "BWF Files", "Broadcast Wave Format"},           {"AIF", "AIF Files", "Audio Interchange File Format"},
+    {"AIFF", "AIFF Files", "Audio Interchange File Format"}, {"AIFC", "AIFC Files", "Audio Interchange File Format"},
+    {"CDDA", "CDDA Files", "Compact Disc Digital Audio"},
+};
