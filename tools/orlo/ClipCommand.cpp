@@ -2,13 +2,12 @@
 
 #include <cstdio>
 #include <nlohmann/json.hpp>
-#include <sstream>
 
+#include "ClipDump.h"
 #include "JsonText.h"
 #include "NoClipReason.h"
 #include "PluginRun.h"
 #include "ResultText.h"
-#include "aaf/dumpAAF.h"
 #include "aafbuilder/NewAAFFromMovie.h"
 
 namespace {
@@ -35,19 +34,15 @@ int ClipCommand::Run(const OrloOptions& options) {
     if (!run.Started()) return kExitFailed;
 
     Json report = {{"file", m_Path}, {"result", nullptr}, {"stage", nullptr}, {"aaf", nullptr}};
-    std::ostringstream dump;
+    std::string dump;
     TOVRESULT result = TOV_OK;
     if (const auto movie = run.NewMovie(m_Path, result)) {
         IAAFFile* file = nullptr;
         result = ZEB::Impl::NewAAFFromMovie(
             movie.get(), ZEB::ZEBString(reinterpret_cast<const unsigned char*>(m_Path.c_str())), &file, &run.Host());
         if (result == TOV_OK) {
-            ZEB::AAFDumpOptions dumpOptions;
-            dumpOptions.format = m_Json ? ZEB::AAFDumpOptions::Format::JSON : ZEB::AAFDumpOptions::Format::Text;
-            dumpOptions.omitClock = m_NoClock;
-            result = ZEB::dumpAAF(file, dump, dumpOptions);
+            result = DumpClip(file, m_Json, m_NoClock, dump);
             file->Release();
-            if (result != TOV_OK) SayRefused(result, "the clip could not be read back");
         } else if (IsLoaderFailure(result)) {
             SayRefused(result, "no AAF library could be loaded (libcom-api.so)");
         } else {
@@ -63,10 +58,10 @@ int ClipCommand::Run(const OrloOptions& options) {
 
     if (m_Json) {
         // The dump writes its texts as UTF-8 from wide strings, so it parses.
-        if (result == TOV_OK) report["aaf"] = Json::parse(dump.str(), nullptr, false);
+        if (result == TOV_OK) report["aaf"] = Json::parse(dump, nullptr, false);
         std::printf("%s\n", JsonDump(report, 2).c_str());
     } else if (result == TOV_OK) {
-        std::fputs(dump.str().c_str(), stdout);
+        std::fputs(dump.c_str(), stdout);
     }
     return result == TOV_OK ? kExitOK : kExitFailed;
 }

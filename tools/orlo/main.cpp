@@ -5,9 +5,11 @@
 
 #include "ChunksCommand.h"
 #include "ClipCommand.h"
+#include "LinkCommand.h"
 #include "OrloOptions.h"
 #include "OrloVersion.h"
 #include "ProbeCommand.h"
+#include "ReadCommand.h"
 #include "VersionCommand.h"
 
 int main(int argc, char** argv) {
@@ -24,6 +26,8 @@ int main(int argc, char** argv) {
     commands.push_back(std::make_unique<ChunksCommand>());
     commands.push_back(std::make_unique<ProbeCommand>());
     commands.push_back(std::make_unique<ClipCommand>());
+    commands.push_back(std::make_unique<LinkCommand>());
+    commands.push_back(std::make_unique<ReadCommand>());
     std::vector<CLI::App*> declared;
     for (auto& command : commands) declared.push_back(command->Declare(app));
 
