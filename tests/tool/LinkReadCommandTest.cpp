@@ -2,7 +2,6 @@
 // from beside the tool, the example take linked to the same clip that
 // `orlo clip` makes, and samples read back through the map as stored.
 #include <gtest/gtest.h>
-#include <openssl/evp.h>
 
 #include <fstream>
 #include <nlohmann/json.hpp>
@@ -15,6 +14,7 @@
 #include "RunTool.h"
 #include "TempFile.h"
 #include "identity/IDText.h"
+#include "tov/host/CryptoLibrary.h"
 
 namespace {
 
@@ -23,7 +23,12 @@ using Json = nlohmann::ordered_json;
 std::string Md5(const std::string& bytes) {
     unsigned char value[EVP_MAX_MD_SIZE];
     unsigned int length = 0;
-    EVP_Digest(bytes.data(), bytes.size(), value, &length, EVP_md5(), nullptr);
+    const CryptoLibrary* crypto = CryptoLibrary::Get();
+    EVP_MD_CTX* digest = crypto->MD_CTX_new();
+    crypto->DigestInit_ex(digest, crypto->md5(), nullptr);
+    crypto->DigestUpdate(digest, bytes.data(), bytes.size());
+    crypto->DigestFinal_ex(digest, value, &length);
+    crypto->MD_CTX_free(digest);
     return ZEB::HexText(value, length, ZEB::HexCase::Lower);
 }
 

@@ -1,7 +1,6 @@
 #include "ReadCommand.h"
 
 #include <fcntl.h>
-#include <openssl/evp.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -22,6 +21,7 @@
 #include "reader/OrloStream.h"
 #include "strings/ZEBString.h"
 #include "tov/IMediaContainer3.h"
+#include "tov/host/CryptoLibrary.h"
 
 namespace {
 
@@ -144,8 +144,12 @@ int ReadCommand::Run(const OrloOptions& options) {
             layout.frames);
         if (!wav->Error().empty()) return Refuse(m_Path, wav->Error());
     }
-    std::unique_ptr<EVP_MD_CTX, decltype(&EVP_MD_CTX_free)> md5(EVP_MD_CTX_new(), EVP_MD_CTX_free);
-    if (m_Md5) EVP_DigestInit_ex(md5.get(), EVP_md5(), nullptr);
+    const CryptoLibrary* crypto = m_Md5 ? CryptoLibrary::Get() : nullptr;
+    if (m_Md5 && !crypto) return Refuse(m_Path, "no MD5: OpenSSL's libcrypto cannot be loaded");
+    const auto freeDigest = [crypto](EVP_MD_CTX* context) { crypto->MD_CTX_free(context); };
+    std::unique_ptr<EVP_MD_CTX, decltype(freeDigest)> md5(m_Md5 ? crypto->MD_CTX_new() : nullptr, freeDigest);
+    if (m_Md5 && (!md5 || crypto->DigestInit_ex(md5.get(), crypto->md5(), nullptr) != 1))
+        return Refuse(m_Path, "no MD5: the digest cannot be started");
 
     const int fd = open(m_Path.c_str(), O_RDONLY | O_CLOEXEC);
     if (fd < 0) return Refuse(m_Path, std::string("cannot open: ") + std::strerror(errno));
@@ -183,7 +187,7 @@ int ReadCommand::Run(const OrloOptions& options) {
             bytes = picked.data();
             size = static_cast<size_t>(out - picked.data());
         }
-        if (m_Md5) EVP_DigestUpdate(md5.get(), bytes, size);
+        if (m_Md5) crypto->DigestUpdate(md5.get(), bytes, size);
         if (wav && !wav->Write(bytes, size)) error = wav->Error();
         frame += count;
         progress.Update(frame);
@@ -203,7 +207,7 @@ int ReadCommand::Run(const OrloOptions& options) {
     if (m_Md5) {
         unsigned char value[EVP_MAX_MD_SIZE];
         unsigned int length = 0;
-        EVP_DigestFinal_ex(md5.get(), value, &length);
+        crypto->DigestFinal_ex(md5.get(), value, &length);
         digest = ZEB::HexText(value, length, ZEB::HexCase::Lower);
         report["md5"] = digest;
     } else {

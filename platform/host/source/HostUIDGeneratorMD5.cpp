@@ -1,9 +1,8 @@
 #include "tov/host/HostUIDGeneratorMD5.h"
 
-#include <openssl/evp.h>
-
 #include <cstring>
 
+#include "tov/host/CryptoLibrary.h"
 #include "tov/sdk/TOVComponent.h"
 
 namespace {
@@ -21,10 +20,12 @@ TOVRESULT HostUIDGeneratorMD5::Begin(void** context) {
     return TOVGuarded([&] {
         if (!context) return TOV_E_INVALIDARG;
         *context = nullptr;
-        EVP_MD_CTX* digest = EVP_MD_CTX_new();
+        const CryptoLibrary* crypto = CryptoLibrary::Get();
+        if (!crypto) return TOV_E_FAIL;
+        EVP_MD_CTX* digest = crypto->MD_CTX_new();
         if (!digest) return TOV_E_OUTOFMEMORY;
-        if (EVP_DigestInit_ex(digest, EVP_md5(), nullptr) != 1) {
-            EVP_MD_CTX_free(digest);
+        if (crypto->DigestInit_ex(digest, crypto->md5(), nullptr) != 1) {
+            crypto->MD_CTX_free(digest);
             return TOV_E_FAIL;
         }
         *context = digest;
@@ -35,7 +36,9 @@ TOVRESULT HostUIDGeneratorMD5::Begin(void** context) {
 TOVRESULT HostUIDGeneratorMD5::AddData(void* context, unsigned char* data, unsigned int count) {
     return TOVGuarded([&] {
         if (!context || (!data && count != 0)) return TOV_E_INVALIDARG;
-        return EVP_DigestUpdate(static_cast<EVP_MD_CTX*>(context), data, count) == 1 ? TOV_OK : TOV_E_FAIL;
+        // A context exists only where Begin found the library.
+        const CryptoLibrary* crypto = CryptoLibrary::Get();
+        return crypto->DigestUpdate(static_cast<EVP_MD_CTX*>(context), data, count) == 1 ? TOV_OK : TOV_E_FAIL;
     });
 }
 
@@ -46,8 +49,9 @@ TOVRESULT HostUIDGeneratorMD5::Finish(_aafUID_t* result, void** context) {
         *context = nullptr;
         unsigned char bytes[EVP_MAX_MD_SIZE];
         unsigned int size = 0;
-        const bool done = EVP_DigestFinal_ex(digest, bytes, &size) == 1 && size == kMD5Size;
-        EVP_MD_CTX_free(digest);
+        const CryptoLibrary* crypto = CryptoLibrary::Get();
+        const bool done = crypto->DigestFinal_ex(digest, bytes, &size) == 1 && size == kMD5Size;
+        crypto->MD_CTX_free(digest);
         if (!done) return TOV_E_FAIL;
         std::memcpy(result, bytes, kMD5Size);
         return TOV_OK;
