@@ -63,6 +63,8 @@ bool OrloReaderSampleMapping::SetFilePath(const ZEBString& path) {
                                                            frameBytes, channels, bits, swapBytes, floatingPoint, start);
     m_Media = std::make_shared<OrloReader::Media>(std::move(descriptor), OrloReader::kMediaTypeAudio, kNoStart,
                                                   stream.GetSampleSize(), stream.GetSampleCount());
+    m_FrameBytes = m_Media->GetSampleSize(0);
+    m_StartPosition = m_Media->GetSampleOffset(0);
 
     HoldStorageCallback(new OrloReaderStorageCallback(path));
     return true;
@@ -110,7 +112,8 @@ TOVRESULT OrloReaderSampleMapping::GetSampleSize(unsigned int, unsigned long lon
 TOVRESULT OrloReaderSampleMapping::GetSamplePosition(unsigned int, unsigned long long sample,
                                                      unsigned long long* out) const {
     return TOVGuarded([&] {
-        *out = MediaFor(out).GetSampleOffset(sample);
+        MediaFor(out);
+        *out = PositionOf(sample);
         return TOV_OK;
     });
 }
@@ -193,8 +196,8 @@ TOVRESULT OrloReaderSampleMapping::GetNumberOfContiguousBytes(unsigned int, unsi
             return TOV_E_OUTOFRANGE;
         }
         const uint64_t last = sample + count - 1;
-        const uint64_t firstPosition = media.GetSampleOffset(sample);
-        const uint64_t lastPosition = media.GetSampleOffset(last);
+        const uint64_t firstPosition = PositionOf(sample);
+        const uint64_t lastPosition = PositionOf(last);
         // Only an overflow of the positions runs backwards.
         if (lastPosition < firstPosition) return TOV_E_UNEXPECTED;
         *out = lastPosition - firstPosition + media.GetSampleSize(last);

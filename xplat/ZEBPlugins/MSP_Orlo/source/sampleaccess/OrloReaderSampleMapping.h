@@ -5,6 +5,7 @@
 /// also one out of range). After `SetFilePath` the answers come from numbers
 /// alone: no file access, no allocation, no lock, so reader threads may ask
 /// at once.
+#include <cstdint>
 #include <memory>
 
 #include "clipmodel/Media.h"
@@ -93,12 +94,19 @@ private:
     /// thrown as TOV_E_INVALIDARG, no media as ZEB_E_NOTREADY.
     const OrloReader::Media& MediaFor(const void* out) const;
     void HoldStorageCallback(IStorageCallback* callback);
+    /// The media's offset of frame `n`, from the two numbers read off it once.
+    uint64_t PositionOf(uint64_t n) const { return m_FrameBytes * n + m_StartPosition; }
 
     TOVPtr<ITOVComponentFactory> m_Factory;
     ZEBString m_Path;
     TOVPtr<IStorageCallback> m_StorageCallback;
     /// Null until SetFilePath has read the file; never changed afterwards.
     std::shared_ptr<OrloReader::Media> m_Media;
+    // Frame 0's size and offset as the media gives them (0 bytes a frame for
+    // media not of audio type), kept plain so that a position is a multiply
+    // and an add, with no call into the media.
+    uint32_t m_FrameBytes = 0;
+    uint64_t m_StartPosition = 0;
 };
 
 }  // namespace Impl
