@@ -47,13 +47,14 @@ std::string RF64Head() {
 }
 
 struct Files {
-    Files() : broadcast(BroadcastWave()), rf64(RF64Head()) {
+    Files() : broadcast(BroadcastWave()), rf64(RF64Head()), exampleTake(ExampleTake::File()) {
         // A hole: the samples take no disk space.
         if (truncate(rf64.Path().c_str(), static_cast<off_t>(RF64Head().size() + kRF64Data)) != 0)
             std::perror("truncate");
     }
     TempFile broadcast;
     TempFile rf64;
+    TempFile exampleTake;
 };
 
 Files* g_files = nullptr;
@@ -71,9 +72,11 @@ void MakeMovie(benchmark::State& state, const TempFile& file) {
 
 void BM_MovieBroadcastWaveWithBextAndIxml(benchmark::State& state) { MakeMovie(state, g_files->broadcast); }
 void BM_MovieRF64_5GiBWithBextAndIxml(benchmark::State& state) { MakeMovie(state, g_files->rf64); }
+void BM_MovieExampleTake(benchmark::State& state) { MakeMovie(state, g_files->exampleTake); }
 
 BENCHMARK(BM_MovieBroadcastWaveWithBextAndIxml);
 BENCHMARK(BM_MovieRF64_5GiBWithBextAndIxml);
+BENCHMARK(BM_MovieExampleTake);
 
 }  // namespace
 

@@ -1,8 +1,14 @@
 // Parsing a typical iXML block of about 4 KB into IXMLData, as every file
-// with an iXML chunk costs on import.
+// with an iXML chunk costs on import; and the memory and time of a chunk of
+// 60 MB in one text node, which a parse must keep within twice its size.
 #include <benchmark/benchmark.h>
 #include <libxml/parser.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
+#include <chrono>
+#include <cstdio>
+#include <fstream>
 #include <string>
 
 #include "TestHost.h"
@@ -87,6 +93,71 @@ void BM_DocumentLoad(benchmark::State& state) {
     ZEB::ZEBTerminate();
 }
 BENCHMARK(BM_DocumentLoad)->Unit(benchmark::kMicrosecond);
+
+// A kilobyte figure of this process's status, such as VmRSS or VmHWM.
+long StatusKB(const std::string& field) {
+    std::ifstream status("/proc/self/status");
+    std::string line;
+    while (std::getline(status, line))
+        if (line.compare(0, field.size() + 1, field + ":") == 0) return std::stol(line.substr(field.size() + 1));
+    return -1;
+}
+
+struct HugeParse {
+    double seconds = 0;
+    long growthKB = -1;
+};
+
+// One parse in a child process, so that its peak memory is its own: the
+// child makes the chunk's text, sets its peak to what it holds, parses, and
+// reports the time and how far the peak rose.
+HugeParse ParseInChild(const std::string& head, size_t noteBytes, const std::string& tail) {
+    int channel[2];
+    HugeParse result;
+    if (pipe(channel) != 0) return result;
+    const pid_t child = fork();
+    if (child == 0) {
+        std::string xml;
+        xml.reserve(head.size() + noteBytes + tail.size());
+        xml.append(head).append(noteBytes, 'n').append(tail);
+        TestHost host;
+        ZEB::ZEBInitialize(host.Get());
+        std::ofstream("/proc/self/clear_refs") << "5";
+        const long before = StatusKB("VmRSS");
+        const auto start = std::chrono::steady_clock::now();
+        Chunks::IXML::IXMLData data;
+        Chunks::IXML::ParceRawIXML(xml, host.Get(), data);
+        result.seconds = std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+        result.growthKB = StatusKB("VmHWM") - before;
+        ZEB::ZEBTerminate();
+        const bool written = write(channel[1], &result, sizeof result) == sizeof result;
+        _exit(written ? 0 : 1);
+    }
+    close(channel[1]);
+    if (child > 0) {
+        if (read(channel[0], &result, sizeof result) != sizeof result) result = HugeParse();
+        waitpid(child, nullptr, 0);
+    }
+    close(channel[0]);
+    return result;
+}
+
+void BM_ParceRawIXMLHugeNote(benchmark::State& state) {
+    const size_t noteBytes = 60u << 20;
+    const std::string head = "<?xml version=\"1.0\" encoding=\"UTF-8\"?><BWFXML><PROJECT>Night Shoot</PROJECT><NOTE>";
+    const std::string tail = "</NOTE></BWFXML>";
+    const double chunkKB = static_cast<double>(head.size() + noteBytes + tail.size()) / 1024;
+    double growthKB = 0;
+    for (auto _ : state) {
+        const HugeParse parse = ParseInChild(head, noteBytes, tail);
+        if (parse.growthKB < 0) state.SkipWithError("the child reported nothing");
+        state.SetIterationTime(parse.seconds);
+        growthKB = std::max(growthKB, static_cast<double>(parse.growthKB));
+    }
+    state.counters["peak_growth_MB"] = growthKB / 1024;
+    state.counters["peak_growth_per_chunk"] = growthKB / chunkKB;
+}
+BENCHMARK(BM_ParceRawIXMLHugeNote)->UseManualTime()->Iterations(3)->Unit(benchmark::kMillisecond);
 
 }  // namespace
 

@@ -6,9 +6,11 @@
 #include <functional>
 
 #include "Bytes.h"
+#include "TempFile.h"
 #include "reader/ByteSwap.h"
 #include "reader/ConvertStrToChunkType.h"
 #include "reader/ExtendedFloat.h"
+#include "reader/OpenForWalk.h"
 #include "reader/OrloStream.h"
 #include "reader/ReadBytes.h"
 #include "reader/int24.h"
@@ -56,6 +58,47 @@ TEST(ReadBytes, ReadsExactlyTheCountOrThrows) {
 }
 
 // The named swaps are one-line uses of one template: two widths stand for all.
+// The walk's stream answers seeks, positions and reads as a plain one, across
+// landings, blocks read onward, the end of the file and failing seeks.
+TEST(OpenForWalk, ReadsAsAPlainStream) {
+    std::string bytes(300000, '\0');
+    for (size_t i = 0; i < bytes.size(); ++i) bytes[i] = static_cast<char>(i * 7 + i / 251);
+    const TempFile temp(bytes);
+    struct Step {
+        int whence;
+        off_t offset;
+        size_t count;
+    };
+    const Step steps[] = {{SEEK_SET, 0, 4},      {SEEK_SET, 0, 12},        {SEEK_CUR, 600, 32},
+                          {SEEK_SET, 4090, 10},  {SEEK_SET, 288698, 1600}, {SEEK_SET, 286000, 5000},
+                          {SEEK_CUR, -100, 200}, {SEEK_END, -10, 20},      {SEEK_SET, 1 << 20, 8},
+                          {SEEK_SET, 5, 200000}, {SEEK_CUR, -300000, 1},   {SEEK_CUR, 70000, 70000}};
+    FILE* walked = OpenForWalk(temp.Path().c_str());
+    FILE* plain = std::fopen(temp.Path().c_str(), "rb");
+    ASSERT_TRUE(walked && plain);
+    for (const Step& step : steps) {
+        SCOPED_TRACE(std::to_string(step.offset) + " from " + std::to_string(step.whence));
+        EXPECT_EQ(fseeko(walked, step.offset, step.whence), fseeko(plain, step.offset, step.whence));
+        EXPECT_EQ(ftello(walked), ftello(plain));
+        std::string fromWalked(step.count, '\0');
+        std::string fromPlain(step.count, '\0');
+        EXPECT_EQ(std::fread(fromWalked.data(), 1, step.count, walked),
+                  std::fread(fromPlain.data(), 1, step.count, plain));
+        EXPECT_EQ(fromWalked, fromPlain);
+        EXPECT_EQ(ftello(walked), ftello(plain));
+        EXPECT_EQ(std::feof(walked), std::feof(plain));
+    }
+    std::fclose(walked);
+    std::fclose(plain);
+    // Anything but a regular file is opened as before, and a missing one not at all.
+    FILE* device = OpenForWalk("/dev/null");
+    ASSERT_TRUE(device);
+    char byte = 0;
+    EXPECT_EQ(std::fread(&byte, 1, 1, device), 0u);
+    std::fclose(device);
+    EXPECT_EQ(OpenForWalk("/nonexistent/file.wav"), nullptr);
+}
+
 TEST(ByteSwap, ReversesEveryByte) {
     int16_t s = 0x1234;
     uint64_t ull = 0xF1F2F3F4F5F6F7F8ull;

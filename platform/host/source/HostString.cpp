@@ -76,7 +76,7 @@ std::vector<unsigned char> TerminatedBytes(Units units) {
 // Units that valid UTF-8 takes in encoding `type`, counted on its bytes: each
 // byte that does not continue a sequence starts a code point, and each lead of
 // a four-byte sequence starts one that UTF-16 writes as a pair.
-size_t UnitsOf(const std::string& utf8, _tovUnicodeType type) {
+size_t UnitsOf(std::string_view utf8, _tovUnicodeType type) {
     if (type == kTOVUnicodeUTF8) return utf8.size();
     size_t units = 0;
     for (const char c : utf8) {
@@ -140,7 +140,7 @@ TOVRESULT HostString::Assign(_tovUnicodeType type, ITOVString* source) {
     return TOVGuarded([&] {
         // Text still kept as it came in as UTF-8 is copied in that form.
         if (auto* same = dynamic_cast<HostString*>(source); same && same->m_WidePending) {
-            const std::string& utf8 = same->m_UTF8;
+            const std::string_view utf8 = same->PendingUTF8();
             return Assign(type, reinterpret_cast<const unsigned char*>(utf8.data()),
                           static_cast<unsigned int>(utf8.size()));
         }
@@ -279,6 +279,7 @@ void HostString::Commit(std::wstring text, _tovUnicodeType type) {
 
 void HostString::Changed(_tovUnicodeType type) {
     m_Type = type;
+    m_Borrowed = nullptr;
     m_UTF8Fresh = m_UTF16Fresh = m_UTF32Fresh = false;
     m_WideHandedOut = false;  // the storage handed out is no longer valid
 }
@@ -286,8 +287,10 @@ void HostString::Changed(_tovUnicodeType type) {
 const std::wstring& HostString::Text() {
     if (m_WidePending) {
         // The bytes were checked when they came in, so they decode.
-        UnicodeCodec::DecodeUTF8(reinterpret_cast<const unsigned char*>(m_UTF8.data()), m_UTF8.size(), m_Text);
+        const std::string_view utf8 = PendingUTF8();
+        UnicodeCodec::DecodeUTF8(reinterpret_cast<const unsigned char*>(utf8.data()), utf8.size(), m_Text);
         m_WidePending = false;
+        m_Borrowed = nullptr;
     }
     return m_Text;
 }
@@ -297,6 +300,11 @@ const std::wstring& HostString::Text() {
 TOVRESULT HostString::GetUTF8String(const unsigned char** out) {
     return TOVGuarded([&] {
         if (!out) return TOV_E_INVALIDARG;
+        // Text kept in an external buffer as UTF-8 is its own view.
+        if (m_Borrowed) {
+            *out = reinterpret_cast<const unsigned char*>(m_Borrowed);
+            return TOV_OK;
+        }
         if (!m_UTF8Fresh || m_WideHandedOut) Refresh(m_UTF8, UnicodeCodec::EncodeUTF8(std::wstring_view(Text())));
         m_UTF8Fresh = true;
         *out = reinterpret_cast<const unsigned char*>(m_UTF8.c_str());
@@ -343,7 +351,7 @@ TOVRESULT HostString::GetWCHARString(wchar_t** out) {
 }
 
 uint32_t HostString::GetCodePointCount() {
-    if (m_WidePending) return static_cast<uint32_t>(UnitsOf(m_UTF8, m_Type));
+    if (m_WidePending) return static_cast<uint32_t>(UnitsOf(PendingUTF8(), m_Type));
     if (m_Type != kTOVUnicodeUTF8 && m_Type != kTOVUnicodeUTF16) return static_cast<uint32_t>(m_Text.size());
     size_t units = 0;
     for (wchar_t wc : m_Text) {
@@ -359,10 +367,14 @@ uint32_t HostString::GetByteCount() {
 }
 
 uint32_t HostString::GetNumCharacters() {
-    return static_cast<uint32_t>(m_WidePending ? UnitsOf(m_UTF8, kTOVUnicodeUTF32) : m_Text.size());
+    return static_cast<uint32_t>(m_WidePending ? UnitsOf(PendingUTF8(), kTOVUnicodeUTF32) : m_Text.size());
 }
 
-int HostString::IsEmpty() { return (m_WidePending ? m_UTF8.empty() : m_Text.empty()) ? 1 : 0; }
+int HostString::IsEmpty() { return (m_WidePending ? PendingUTF8().empty() : m_Text.empty()) ? 1 : 0; }
+
+std::string_view HostString::PendingUTF8() const {
+    return m_Borrowed ? std::string_view(m_Borrowed, m_BorrowedLength) : std::string_view(m_UTF8);
+}
 
 std::wstring HostString::CodePoints() {
     std::wstring text(Text());
@@ -527,10 +539,14 @@ TOVRESULT HostString::SetExternalBuffer(_tovUnicodeType type, unsigned char* buf
     return TOVGuarded([&] {
         if (!buffer || !IsKnownType(type)) return TOV_E_INVALIDARG;
         if (m_External) return ZEB_E_ALREADYSET;
-        std::wstring text;
         if (type == kTOVUnicodeUTF8) {
-            text = ReadBuffer<unsigned char>(buffer, size);
-        } else if (type == kTOVUnicodeUTF16) {
+            BorrowUTF8(buffer, size);
+            m_External = buffer;
+            m_ExternalSize = size;
+            return TOV_OK;
+        }
+        std::wstring text;
+        if (type == kTOVUnicodeUTF16) {
             text = ReadBuffer<unsigned short>(buffer, size);
         } else {
             text = ReadBuffer<unsigned int>(buffer, size);
@@ -543,10 +559,31 @@ TOVRESULT HostString::SetExternalBuffer(_tovUnicodeType type, unsigned char* buf
     });
 }
 
+// UTF-8 in the caller's buffer is, like UTF-8 handed in, kept as it is and
+// decoded only when code points are needed: the buffer may hold a whole
+// document, which neither a copy nor four bytes a character should double.
+void HostString::BorrowUTF8(const unsigned char* buffer, unsigned int size) {
+    const void* zero = std::memchr(buffer, 0, size);
+    if (!zero) Fail(TOV_E_INVALIDARG);  // no terminator within the buffer
+    const size_t length = static_cast<size_t>(static_cast<const unsigned char*>(zero) - buffer);
+    if (!UnicodeCodec::IsValidUTF8(buffer, length)) Fail(TOV_E_INVALIDARG);
+    m_Text.clear();
+    m_WidePending = true;
+    Changed(kTOVUnicodeUTF8);
+    m_Borrowed = reinterpret_cast<const char*>(buffer);
+    m_BorrowedLength = length;
+}
+
 TOVRESULT HostString::RemoveExternalBuffer(unsigned char** buffer) {
     if (!buffer) return TOV_E_INVALIDARG;
     *buffer = m_External;
     if (!m_External) return ZEB_E_NOTREADY;
+    if (m_Borrowed) {
+        // The text stays, now in a copy of the string's own.
+        m_UTF8.assign(m_Borrowed, m_BorrowedLength);
+        m_Borrowed = nullptr;
+        m_UTF8Fresh = true;
+    }
     m_External = nullptr;
     m_ExternalSize = 0;
     return TOV_OK;

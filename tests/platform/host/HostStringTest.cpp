@@ -422,6 +422,9 @@ TEST_F(HostString, KeepsItsTextInAnExternalBufferWhileItFits) {
     EXPECT_EQ(s->SetExternalBuffer(kTOVUnicodeUTF8, buffer, sizeof buffer), ZEB_E_ALREADYSET);
     EXPECT_EQ(UTF8Of(s.Get()), "abc");
     EXPECT_EQ(s->GetUnicodeType(), kTOVUnicodeUTF8);
+    const unsigned char* view = nullptr;
+    ASSERT_EQ(s->GetUTF8String(&view), TOV_OK);
+    EXPECT_EQ(view, buffer);  // UTF-8 is read where it stands, not copied
 
     ASSERT_EQ(s->Append(Bytes(u8"dé"), 3), TOV_OK);  // 7 bytes with the terminator
     EXPECT_STREQ(reinterpret_cast<char*>(buffer), u8"abcdé");
@@ -447,6 +450,13 @@ TEST_F(HostString, KeepsItsTextInAnExternalBufferWhileItFits) {
     EXPECT_EQ(std::memcmp(buffer, utf16, sizeof utf16), 0);
     EXPECT_EQ(s->RemoveExternalBuffer(&handedBack), ZEB_E_NOTREADY);
     EXPECT_EQ(handedBack, nullptr);
+
+    // Removed before any change, the buffer leaves its text with the string.
+    std::memcpy(buffer, "xyz", 4);
+    ASSERT_EQ(s->SetExternalBuffer(kTOVUnicodeUTF8, buffer, sizeof buffer), TOV_OK);
+    ASSERT_EQ(s->RemoveExternalBuffer(&handedBack), TOV_OK);
+    buffer[0] = 'X';
+    EXPECT_EQ(UTF8Of(s.Get()), "xyz");
 }
 
 TEST_F(HostString, ExternalTextNeedsNoAlignmentAndMayNotGrowPastTheBuffer) {

@@ -6,7 +6,9 @@
 ///   GetUnicodeType reports, what the counts measure and the form an external
 ///   buffer is kept in. A new string is empty and wide (kTOVUnicodeWCHAR).
 /// - Text handed in as UTF-8 is kept as it came, as the UTF-8 view, and
-///   decoded into code points only when something needs them.
+///   decoded into code points only when something needs them. So is UTF-8
+///   in an external buffer, which is then its own UTF-8 view: no copy of it
+///   is made until the text changes or the buffer is removed.
 /// - Input text ends at its first zero unit within `n`; what follows is not
 ///   read. A null pointer with `n` 0 or 1 is the empty text, with a larger `n`
 ///   TOV_E_INVALIDARG. So the text never holds U+0000 through the interface,
@@ -34,6 +36,7 @@
 /// - Null pointer arguments are TOV_E_INVALIDARG; an unknown encoding too.
 #include <cstdint>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "tov/ITOVString.h"
@@ -112,6 +115,11 @@ private:
     const std::wstring& Text();
     /// The text with every non-scalar value replaced by U+FFFD.
     std::wstring CodePoints();
+    /// The UTF-8 not yet decoded: the external buffer's while borrowed, else m_UTF8.
+    std::string_view PendingUTF8() const;
+    /// Takes the zero-terminated UTF-8 at the start of `buffer` as the text,
+    /// in place; a missing terminator or malformed text throws TOV_E_INVALIDARG.
+    void BorrowUTF8(const unsigned char* buffer, unsigned int size);
     /// Makes `text` the string's text in encoding `type`, or throws
     /// TOV_E_OUTOFRANGE when an external buffer cannot hold it; all or nothing.
     void Commit(std::wstring text, _tovUnicodeType type);
@@ -138,6 +146,9 @@ private:
     bool m_WidePending = false;
     _tovUnicodeType m_Type = kTOVUnicodeWCHAR;
     std::string m_UTF8;
+    /// While set, the text is the UTF-8 in the external buffer, not yet decoded.
+    const char* m_Borrowed = nullptr;
+    size_t m_BorrowedLength = 0;
     std::vector<unsigned short> m_UTF16;
     std::vector<unsigned int> m_UTF32;
     /// Which views match the text. A view is remade only when the text changed

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 #include <exception>
+#include <iterator>
+#include <string_view>
 
 #include "reader/ReadValue.h"
 
@@ -73,19 +75,23 @@ void BEXTChunk::ParseBEXTDescriptionField() {
     if (std::all_of(m_Description.begin(), m_Description.end(), [](char c) { return c == '\0'; })) return;
     try {
         // Recorders write one keyword a line, each behind a one-character type
-        // mark ("sSCENE=12A"), closed by CR LF or a zero byte.
+        // mark ("sSCENE=12A"), closed by CR LF or a zero byte. The zero bytes
+        // that pad the field are many empty lines, so lines are only looked at
+        // in place.
+        const std::string_view text(m_Description);
+        const auto endsLine = [](char c) { return c == '\r' || c == '\n' || c == '\0'; };
         size_t start = 0;
-        while (start <= m_Description.size()) {
-            size_t end = m_Description.find_first_of(std::string("\r\n\0", 3), start);
-            if (end == std::string::npos) end = m_Description.size();
-            const std::string piece = m_Description.substr(start, end - start);
+        while (start <= text.size()) {
+            const size_t end = std::find_if(text.begin() + start, text.end(), endsLine) - text.begin();
+            const std::string_view piece = text.substr(start, end - start);
             start = end + 1;
             const size_t equals = piece.find('=');
-            if (piece.size() < 2 || equals == std::string::npos) continue;
-            const std::string key = equals == 0 ? std::string() : piece.substr(1, equals - 1);
-            std::string value = piece.substr(equals + 1);
-            value.erase(std::remove(value.begin(), value.end(), '"'), value.end());
-            m_ParsedDescription[key] = value;
+            if (piece.size() < 2 || equals == std::string_view::npos) continue;
+            const std::string key(equals == 0 ? std::string_view() : piece.substr(1, equals - 1));
+            std::string value;
+            const std::string_view rest = piece.substr(equals + 1);
+            std::remove_copy(rest.begin(), rest.end(), std::back_inserter(value), '"');
+            m_ParsedDescription[key] = std::move(value);
         }
     } catch (...) {
         // Whatever goes wrong here, the chunk keeps the keywords taken so far.

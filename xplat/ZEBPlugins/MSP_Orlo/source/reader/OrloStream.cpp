@@ -6,6 +6,7 @@
 
 #include "reader/CalcBytesRemaining.h"
 #include "reader/ConvertStrToChunkType.h"
+#include "reader/OpenForWalk.h"
 #include "reader/PerformAdditionalInitialization.h"
 #include "reader/ReadBytes.h"
 #include "reader/ReadValue.h"
@@ -24,7 +25,7 @@ OrloStream::OrloStream(const char* path, unsigned int chunks) {
 
     try {
         m_FullFileName = path ? path : "";
-        m_File = path ? std::fopen(path, "rb") : nullptr;
+        m_File = path ? HelperFunctions::OpenForWalk(path) : nullptr;
         if (!m_File) throw "File could not be opened";
         m_FileSize = Chunks::CalcBytesRemaining(path, m_File);
         ReadAndParseFile(chunks);

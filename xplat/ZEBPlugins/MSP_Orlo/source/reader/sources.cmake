@@ -9,6 +9,7 @@ target_sources(OrloPlugin PRIVATE
     ${CMAKE_CURRENT_LIST_DIR}/DS64Chunk.cpp
     ${CMAKE_CURRENT_LIST_DIR}/ExtendedFloat.cpp
     ${CMAKE_CURRENT_LIST_DIR}/FMTChunk.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/OpenForWalk.cpp
     ${CMAKE_CURRENT_LIST_DIR}/OrloStream.cpp
     ${CMAKE_CURRENT_LIST_DIR}/ParseOriginationTime.cpp
     ${CMAKE_CURRENT_LIST_DIR}/PerformAdditionalInitialization.cpp

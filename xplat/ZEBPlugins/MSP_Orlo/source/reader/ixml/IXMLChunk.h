@@ -18,8 +18,9 @@ public:
     /// first "encording" to "encoding" (a writer misspells its declaration).
     bool InitChunkFromStream(const ChunkHeader_t& header, FILE* file, bool wrongEndian) override;
 
-    /// A copy of the mended text.
-    std::string GetRawXml() const { return m_RawXml; }
+    /// The mended text, as long as the chunk lives: a document may be tens of
+    /// megabytes, so a caller that keeps it copies it.
+    const std::string& GetRawXml() const { return m_RawXml; }
 
 private:
     std::string m_RawXml;

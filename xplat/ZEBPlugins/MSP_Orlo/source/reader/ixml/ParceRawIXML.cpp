@@ -163,8 +163,12 @@ void GetTrackFromXMLWithNameCheck(ZEBXmlElement* element, IXMLData* data) {
 
 TOVRESULT ParceRawIXML(const std::string& rawXml, ITOVComponentFactory* factory, IXMLData& data) {
     return TOVGuarded([&] {
-        // A zero byte ends the text, as it ends any C string.
-        const ZEBString text(reinterpret_cast<const unsigned char*>(rawXml.c_str()));
+        // A zero byte ends the text, as it ends any C string. The string keeps
+        // the text where it stands, in the chunk: a document may be tens of
+        // megabytes, and parsing only reads it, so nothing writes there.
+        ZEBString text;
+        text.SetExternalBuffer(kTOVUnicodeUTF8, reinterpret_cast<unsigned char*>(const_cast<char*>(rawXml.c_str())),
+                               static_cast<unsigned int>(rawXml.size() + 1));
         ZEB::XMLUtils::ZEBXmlDoc document(factory);
         const TOVRESULT loaded = document.Load(text);
         if (loaded < 0) return loaded;
