@@ -1,9 +1,11 @@
 #pragma once
-/// The module's own start-up sequence: the host's factory kept, `g_pConsole`
-/// set to the host's console, the toggles registered; undone in reverse order
-/// when the object goes. It is what the module's entry points are to run, and
-/// what starts the plug-in in process meanwhile. One at a time: the
-/// plug-in's globals are the process's.
+/// The plug-in started in process, on a host whose utility library the caller
+/// has started: the host's factory kept, `g_pConsole` set to the host's
+/// console, the toggles registered; undone in reverse order when the object
+/// goes. The loadable module's `TOVStartup` does this and more (it starts the
+/// library itself, names the logger and says it is loaded); the tool's
+/// in-process commands, the tests, the benchmarks and the fuzzers use this.
+/// One at a time: the plug-in's globals are the process's.
 #include "tov/ITOVUnknown.h"
 #include "tov/TOVResult.h"
 
