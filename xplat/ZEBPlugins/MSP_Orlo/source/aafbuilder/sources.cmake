@@ -8,6 +8,8 @@ target_sources(OrloPlugin PRIVATE
     ${CMAKE_CURRENT_LIST_DIR}/AddMovieMetaData.cpp
     ${CMAKE_CURRENT_LIST_DIR}/AddTimecode.cpp
     ${CMAKE_CURRENT_LIST_DIR}/CAAFBuiltinDefs.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/ClipSteps.cpp
     ${CMAKE_CURRENT_LIST_DIR}/FrameRateAndDropToString.cpp
     ${CMAKE_CURRENT_LIST_DIR}/NewAAFFromMovie.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/TransientClip.cpp
     ${CMAKE_CURRENT_LIST_DIR}/WideThroughString.cpp)
