@@ -2,7 +2,9 @@
 # comments of a transient AAF file.
 target_sources(OrloPlugin PRIVATE
     ${CMAKE_CURRENT_LIST_DIR}/AAFFromMovie.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/AAFFromMovieWithGrouping.cpp
     ${CMAKE_CURRENT_LIST_DIR}/AddAudioDescriptor.cpp
+    ${CMAKE_CURRENT_LIST_DIR}/AddAudioTracksFromGroupingToAAF.cpp
     ${CMAKE_CURRENT_LIST_DIR}/AddAudioTracksToAAF.cpp
     ${CMAKE_CURRENT_LIST_DIR}/AddLocator.cpp
     ${CMAKE_CURRENT_LIST_DIR}/AddMovieMetaData.cpp
