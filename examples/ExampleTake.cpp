@@ -1,17 +1,18 @@
 #include "ExampleTake.h"
 
-#include <cmath>
 #include <cstdint>
 
 #include "AudioFileWriter.h"
 #include "Bytes.h"
 #include "ChunkPayloads.h"
+#include "ExampleIxml.h"
+#include "ExampleTone.h"
 
 namespace ExampleTake {
 
 namespace {
 
-constexpr uint32_t kRate = 48000;
+using ExampleTone::kRate;
 // 01:00:00:00 as samples since midnight.
 constexpr uint64_t kStart = 3600ull * kRate;
 
@@ -55,35 +56,11 @@ std::string IxmlPayload(size_t padTo) {
         "  <CIRCLED>TRUE</CIRCLED>\n"
         "  <FILE_UID>ORL12A0003D20240517T134510A1B2C3</FILE_UID>\n"
         "  <UBITS>12311804</UBITS>\n"
-        "  <NOTE>wind from the east</NOTE>\n"
-        "  <SPEED>\n"
-        "    <MASTER_SPEED>25/1</MASTER_SPEED>\n"
-        "    <CURRENT_SPEED>25/1</CURRENT_SPEED>\n"
-        "    <TIMECODE_RATE>25/1</TIMECODE_RATE>\n"
-        "    <TIMECODE_FLAG>NDF</TIMECODE_FLAG>\n"
-        "    <FILE_SAMPLE_RATE>48000</FILE_SAMPLE_RATE>\n"
-        "    <AUDIO_BIT_DEPTH>24</AUDIO_BIT_DEPTH>\n"
-        "    <DIGITIZER_SAMPLE_RATE>48000</DIGITIZER_SAMPLE_RATE>\n"
-        "    <TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_HI>0</TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_HI>\n"
-        "    <TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_LO>" +
-        start +
-        "</TIMESTAMP_SAMPLES_SINCE_MIDNIGHT_LO>\n"
-        "    <TIMESTAMP_SAMPLE_RATE>48000</TIMESTAMP_SAMPLE_RATE>\n"
-        "  </SPEED>\n"
+        "  <NOTE>wind from the east</NOTE>\n" +
+        ExampleIxml::Speed(kStart) +
         "  <TRACK_LIST>\n"
-        "    <TRACK_COUNT>2</TRACK_COUNT>\n"
-        "    <TRACK>\n"
-        "      <CHANNEL_INDEX>1</CHANNEL_INDEX>\n"
-        "      <INTERLEAVE_INDEX>1</INTERLEAVE_INDEX>\n"
-        "      <NAME>Boom</NAME>\n"
-        "      <FUNCTION>M</FUNCTION>\n"
-        "    </TRACK>\n"
-        "    <TRACK>\n"
-        "      <CHANNEL_INDEX>2</CHANNEL_INDEX>\n"
-        "      <INTERLEAVE_INDEX>2</INTERLEAVE_INDEX>\n"
-        "      <NAME>Lav</NAME>\n"
-        "      <FUNCTION>M</FUNCTION>\n"
-        "    </TRACK>\n"
+        "    <TRACK_COUNT>2</TRACK_COUNT>\n" +
+        ExampleIxml::Track(1, 1, "Boom") + ExampleIxml::Track(2, 2, "Lav") +
         "  </TRACK_LIST>\n"
         "  <BEXT>\n"
         "    <BWF_ORIGINATOR>Orlo example</BWF_ORIGINATOR>\n"
@@ -99,21 +76,7 @@ std::string IxmlPayload(size_t padTo) {
     return text;
 }
 
-std::string Samples() {
-    // One period of 1 kHz is 48 samples; each value is rounded once, so the
-    // bytes do not depend on how the period is stepped through.
-    constexpr int kPeriod = kRate / 1000;
-    const double pi = std::acos(-1.0);
-    std::string period;
-    for (int i = 0; i < kPeriod; ++i) {
-        const auto value = static_cast<int32_t>(std::lround(0.1 * 8388607.0 * std::sin(2.0 * pi * i / kPeriod)));
-        const std::string sample = Bytes::LE32(static_cast<uint32_t>(value)).substr(0, 3);
-        period += sample + sample;
-    }
-    std::string samples;
-    for (uint32_t done = 0; done < kRate; done += kPeriod) samples += period;
-    return samples;
-}
+std::string Samples() { return ExampleTone::Samples(1000, 2); }
 
 std::string File() {
     Payload::Fmt fmt;

@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs what is missing, builds, and runs every test: once in a plain
 # build, once more under AddressSanitizer and UndefinedBehaviorSanitizer; then
-# runs the fuzzers for two minutes and a half.
+# runs the fuzzers for two minutes and forty seconds.
 set -euo pipefail
 root=$(cd "$(dirname "$0")/.." && pwd)
 bash "$root/scripts/install-deps.sh"
@@ -16,10 +16,11 @@ ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:ha
 
 # The fuzzers, built with clang, under AddressSanitizer: the chunk walk for a
 # minute, the whole intake of a file and the iXML text for half a minute each,
-# the link through the container and the sample map and the clip model's text
-# parsers for twenty seconds each.
+# the link through the container and the sample map, the clip model's text
+# parsers and the group scan's file names for twenty seconds each.
 bash "$root/scripts/fuzz.sh" 60 fuzz_chunk_stream
 bash "$root/scripts/fuzz.sh" 30 fuzz_movie
 bash "$root/scripts/fuzz.sh" 30 fuzz_ixml
 bash "$root/scripts/fuzz.sh" 20 fuzz_link
 bash "$root/scripts/fuzz.sh" 20 fuzz_clip_text
+bash "$root/scripts/fuzz.sh" 20 fuzz_group_names

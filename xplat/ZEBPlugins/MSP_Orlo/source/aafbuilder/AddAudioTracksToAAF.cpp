@@ -1,12 +1,12 @@
 #include "aafbuilder/AddAudioTracksToAAF.h"
 
-#include <cmath>
 #include <cwchar>
 #include <memory>
 #include <vector>
 
 #include "aaf/AAFDescriptorExtensions.h"
 #include "aafbuilder/AddAudioDescriptor.h"
+#include "aafbuilder/ClipSteps.h"
 #include "aafbuilder/IAAFSmartPointer.h"
 #include "clipmodel/TruncateToInteger.h"
 #include "tov/sdk/TOVFailureStyle.h"
@@ -36,12 +36,6 @@ std::shared_ptr<Media> LastAudioMedia(const OrloReader::Movie& movie, aafUInt32&
     return audio;
 }
 
-IAAFSmartPointer<IAAFMobSlot> LookupSlot(IAAFMob* mob, aafSlotID_t id) {
-    IAAFSmartPointer<IAAFMobSlot> slot;
-    TOVCheck(IAAFSmartPointer<IAAFMob>(mob)->LookupSlot(id, &slot));
-    return slot;
-}
-
 // The source reference of the slot's Source Clip; empty when the clip does
 // not answer IAAFSourceReference2 and `tolerated` says that may be.
 IAAFSmartPointer<IAAFSourceReference2> SourceReference(IAAFMobSlot* slot, bool tolerated) {
@@ -53,12 +47,6 @@ IAAFSmartPointer<IAAFSourceReference2> SourceReference(IAAFMobSlot* slot, bool t
     const AAFRESULT queried = clip->QueryInterface(IID_IAAFSourceReference2, reinterpret_cast<void**>(&reference));
     if (!tolerated) TOVCheck(queried);
     return reference;
-}
-
-// 48 hours of edit units, rounded up.
-aafLength_t TapeLength(aafLength_t length, const aafRational_t& editRate) {
-    const double padding = std::ceil(editRate.numerator * 172800.0 / editRate.denominator);
-    return length < padding ? HelperFunctions::TruncateToInt64(static_cast<double>(length) + padding) : length;
 }
 
 }  // namespace

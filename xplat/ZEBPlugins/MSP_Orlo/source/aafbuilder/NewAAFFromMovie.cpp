@@ -1,6 +1,7 @@
 #include "aafbuilder/NewAAFFromMovie.h"
 
 #include "aafbuilder/AAFFromMovie.h"
+#include "aafbuilder/AAFFromMovieWithGrouping.h"
 #include "tov/sdk/TOVFailureStyle.h"
 
 namespace ZEB {
@@ -8,10 +9,11 @@ namespace Impl {
 
 TOVRESULT NewAAFFromMovie(OrloReader::Movie* movie, const ZEBString& path, IAAFFile** out,
                           ITOVComponentFactory* factory) {
-    // A Movie gathered from sibling mono files will take a builder of its own,
-    // which is not part of the plug-in yet: until the group scan makes such
-    // Movies, every Movie is one file's, and AAFFromMovie refuses a null one.
-    return TOVGuarded([&] { return AAFFromMovie(movie, path, out, factory); });
+    return TOVGuarded([&] {
+        // A null Movie is no group; AAFFromMovie refuses it.
+        if (movie != nullptr && movie->IsMonophonicGroup()) return AAFFromMovieWithGrouping(movie, path, out, factory);
+        return AAFFromMovie(movie, path, out, factory);
+    });
 }
 
 }  // namespace Impl

@@ -10,7 +10,8 @@ namespace ZEB {
 namespace Impl {
 
 /// Builds the transient AAF file of `movie` into `*out` (the caller's
-/// reference). Returns 0 or a result code; never throws.
+/// reference): the grouped clip for a Movie that the group scan made, else
+/// the single-file clip. Returns 0 or a result code; never throws.
 TOVRESULT NewAAFFromMovie(OrloReader::Movie* movie, const ZEBString& path, IAAFFile** out,
                           ITOVComponentFactory* factory);
 

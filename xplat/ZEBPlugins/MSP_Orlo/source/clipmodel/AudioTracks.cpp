@@ -5,6 +5,7 @@
 
 #include "clipmodel/TextHelpers.h"
 #include "grouping/ConvertAlphaIndexToNumber.h"
+#include "grouping/FindAndParseFilesForGrouping.h"
 #include "reader/ByteSwap.h"
 #include "reader/ixml/IXMLTextParsers.h"
 
@@ -46,7 +47,18 @@ bool InterleaveIndexComparator(IXMLTrack a, IXMLTrack b) { return a.GetInterleav
 void AddAudioTracks(const Chunks::BEXT::BEXTChunk* bext, bool hasBext, const Chunks::IXML::IXMLData& ixml, bool hasIxml,
                     TimeCodeInfo start, unsigned long long sampleCount, int channels, double sampleRate,
                     unsigned int bitsPerSample, bool wrongEndian, bool floatingPoint, unsigned long long startPosition,
-                    Movie& movie, _aafMobID_t*, ITOVComponentFactory*, bool) {
+                    Movie& movie, _aafMobID_t* mobID, ITOVComponentFactory* factory, bool allowGrouping) {
+    if (channels == 1 && allowGrouping) {
+        std::vector<std::shared_ptr<Track>> tracks;
+        auto groupLength = static_cast<long long>(sampleCount);
+        if (GroupingFunctions::FindAndParseFilesForGrouping(movie.GetFilePath(), tracks, movie.GetMovieEditRate(),
+                                                            groupLength, mobID, factory, movie)) {
+            movie.SetMovieGroupLength(groupLength);
+            movie.SetHasMovieGroupLength(true);
+            AddAudioTracksFromMonophonicGroup(start, tracks, movie);
+            return;
+        }
+    }
     AddAudioTracksFromMetadata(bext, hasBext, ixml, hasIxml, start, sampleCount, channels, sampleRate, bitsPerSample,
                                wrongEndian, floatingPoint, startPosition, movie);
 }

@@ -13,9 +13,11 @@
 
 namespace OrloReader {
 
-/// The audio tracks of the file, one per channel, in file channel order.
-/// `mobID`, `factory` and `allowGrouping` serve the search for sibling mono
-/// files, which is not part of the intake yet: every file is taken alone.
+/// The audio tracks of the clip. A one-channel file, when `allowGrouping`
+/// says so, first looks for the sibling files of its recording: a group
+/// fills the Movie with its members' tracks and length, and replaces `mobID`
+/// by the group's identity. Otherwise one track per channel of the file, in
+/// file channel order.
 void AddAudioTracks(const Chunks::BEXT::BEXTChunk* bext, bool hasBext, const Chunks::IXML::IXMLData& ixml, bool hasIxml,
                     TimeCodeInfo start, unsigned long long sampleCount, int channels, double sampleRate,
                     unsigned int bitsPerSample, bool wrongEndian, bool floatingPoint, unsigned long long startPosition,
